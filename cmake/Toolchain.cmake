@@ -1,0 +1,27 @@
+# What every target is compiled with. The application is C++14, everything else C++20.
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_C_STANDARD 11)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+
+find_program(CCACHE ccache)
+if(CCACHE)
+  set(CMAKE_C_COMPILER_LAUNCHER "${CCACHE}")
+  set(CMAKE_CXX_COMPILER_LAUNCHER "${CCACHE}")
+endif()
+
+add_compile_options(-Wall -Wextra -Wshadow -Wnon-virtual-dtor -ffile-prefix-map=${CMAKE_SOURCE_DIR}/=)
+if(KEST_WERROR)
+  add_compile_options(-Werror)
+endif()
+if(KEST_SANITIZE)
+  add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=address,undefined)
+endif()
+
+find_package(PkgConfig REQUIRED)
+find_package(SQLiteCpp REQUIRED)
+find_package(nlohmann_json REQUIRED)
+find_package(CLI11 REQUIRED)
+pkg_check_modules(LIBXML2 REQUIRED IMPORTED_TARGET libxml-2.0)

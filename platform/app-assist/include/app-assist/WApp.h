@@ -1,0 +1,49 @@
+#pragma once
+
+#include <app_control.h>
+
+#include <memory>
+
+namespace app_assist {
+
+class WWindow;
+
+/// The application object of the framework: one a process. A subclass answers its life cycle.
+class WApp {
+public:
+    WApp();
+    virtual ~WApp();
+    WApp(const WApp&) = delete;
+    WApp& operator=(const WApp&) = delete;
+
+    /// Makes the process an application of the device (its language, text domain, display, theme and bus), runs
+    /// onStart, onCreate, the first onAppControl from inside the main loop, and the main loop until it ends,
+    /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request.
+    /// Returns the process's exit status: 0, or 1 when the device cannot be opened or onCreate returned false
+    /// (said on standard error).
+    int start(int argc, char** argv);
+
+    /// Takes the window over and creates it. The window ends the application when it is closed.
+    void attachWindow(WWindow* window);
+    /// Null until attachWindow(), and after the window is gone.
+    WWindow* getWindow() const;
+
+    /// The process's application object; null outside its life.
+    static WApp* getInstance();
+
+protected:
+    virtual void onStart(int argc, char** argv);
+    /// False ends the application with status 1.
+    virtual bool onCreate();
+    virtual void onTerminate();
+    virtual void onPause();
+    virtual void onResume();
+    /// A launch request. `request` is freed by the framework afterwards.
+    virtual void onAppControl(app_control_h request, bool firstLaunch);
+
+private:
+    friend class Runtime;
+    std::unique_ptr<WWindow> window_;
+};
+
+}  // namespace app_assist

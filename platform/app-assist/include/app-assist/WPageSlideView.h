@@ -1,0 +1,41 @@
+#pragma once
+
+#include "app-assist/WView.h"
+
+#include <vector>
+
+namespace app_assist {
+
+/// A view of pages side by side, one in view at a time, that a swipe turns. Owns the pages that were appended.
+class WPageSlideView : public WView {
+public:
+    WPageSlideView();
+    ~WPageSlideView() override;
+
+    /// Whether the scroll bar shows; to be called before onCreate(). Off by default.
+    void setShowScroll(bool show) { showScroll_ = show; }
+    /// Null before onCreate().
+    Evas_Object* getScroller() const { return scroller_; }
+
+    /// Takes `page` over, creates it and makes it the last page. Null is ignored.
+    void appendPage(WView* page);
+    /// Brings page `index` into view at once, also before anything was laid out. `relayout` has the pages laid
+    /// out first, as is needed when they were just appended. An index outside the pages does nothing.
+    void showPage(int index, bool relayout);
+    int getPageCount() const { return static_cast<int>(pages_.size()); }
+
+protected:
+    Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override;
+    /// Makes the object that holds the pages in a row.
+    virtual Evas_Object* onCreateLayout(Evas_Object* parent);
+    /// Sets the scroller up.
+    virtual void onInitScroller(Evas_Object* scroller);
+
+private:
+    bool showScroll_ = false;
+    Evas_Object* scroller_ = nullptr;
+    Evas_Object* row_ = nullptr;
+    std::vector<WView*> pages_;
+};
+
+}  // namespace app_assist

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "tizen_error.h"
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+typedef enum {
+    PREFERENCE_ERROR_NONE = TIZEN_ERROR_NONE,
+    PREFERENCE_ERROR_INVALID_PARAMETER = TIZEN_ERROR_INVALID_PARAMETER,
+    PREFERENCE_ERROR_OUT_OF_MEMORY = TIZEN_ERROR_OUT_OF_MEMORY,
+    PREFERENCE_ERROR_NO_KEY = TIZEN_ERROR_KEY_NOT_AVAILABLE,
+    PREFERENCE_ERROR_IO_ERROR = TIZEN_ERROR_IO_ERROR
+} preference_error_e;
+
+/**
+ * Stores a string in the calling application's preferences; an old value is replaced.
+ * @return PREFERENCE_ERROR_NONE; INVALID_PARAMETER for a NULL argument; IO_ERROR when it could not be written
+ */
+int preference_set_string(const char* key, const char* value);
+
+/**
+ * Reads a string from the calling application's preferences.
+ * @param[out] value to be freed with free(); untouched on error
+ * @return PREFERENCE_ERROR_NONE; NO_KEY when it was never set; INVALID_PARAMETER; IO_ERROR
+ */
+int preference_get_string(const char* key, char** value);
+
+/** Removes all preferences of the calling application. @return PREFERENCE_ERROR_NONE or IO_ERROR */
+int preference_remove_all(void);
+
+#ifdef __cplusplus
+}
+#endif

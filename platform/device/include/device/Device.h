@@ -1,0 +1,80 @@
+#pragma once
+
+#include "device/Application.h"
+#include "device/Database.h"
+#include "device/Events.h"
+#include "device/Folder.h"
+#include "device/Log.h"
+#include "device/Packages.h"
+#include "device/Preferences.h"
+#include "device/Screen.h"
+#include "device/Settings.h"
+#include "device/Usage.h"
+
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace device {
+
+/// One device: its folder, its database and the services on them. The one place that holds device state.
+class Device {
+public:
+    struct Options {
+        Folder folder;
+        /// Folders of packages that every device has; the first one that holds an id wins.
+        std::vector<std::filesystem::path> preinstalled;
+        /// The platform's own data: locale/ and the theme.
+        std::filesystem::path data;
+        Database::Check check = Database::Check::Quick;
+
+        /// What the environment and the build say.
+        static Options standard();
+    };
+
+    /// Makes the folder and a fresh database where there is none.
+    /// Throws Error when that fails and DamagedError when a damaged database was set aside.
+    explicit Device(Options options);
+    ~Device();
+
+    /// The process's device, opened at the first call with Options::standard(). A damaged database is set aside,
+    /// said on standard error, and replaced. Throws Error when the device cannot be opened.
+    static Device& current();
+    /// Puts another device in its place (nullptr: none, the next current() opens one anew). For tests and tools.
+    static void setCurrent(std::unique_ptr<Device> device);
+
+    const Folder& folder() const { return options_.folder; }
+    const std::filesystem::path& data() const { return options_.data; }
+    Database& database() { return database_; }
+    Events& events() { return events_; }
+    Settings& settings() { return settings_; }
+    Preferences& preferences() { return preferences_; }
+    Packages& packages() { return packages_; }
+    Usage& usage() { return usage_; }
+    Log& log() { return log_; }
+
+    /// The display, by the setting keys::screen.
+    const Screen& screen() const;
+    /// The display language without its codeset ("ko_KR").
+    std::string language() const;
+    /// The languages that the device's own texts exist in, in alphabetical order ("en_US", ...).
+    std::vector<std::string> languages() const;
+
+    /// The application of this process. Application::ofThisProcess() unless setApplication() said otherwise.
+    const Application& application();
+    void setApplication(Application application);
+
+private:
+    Options options_;
+    Database database_;
+    Events events_;
+    Settings settings_;
+    Preferences preferences_;
+    Packages packages_;
+    Usage usage_;
+    Log log_;
+    std::unique_ptr<Application> application_;
+};
+
+}  // namespace device

@@ -1,0 +1,60 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace device {
+
+class Database;
+class Events;
+class Folder;
+
+/// What a package's tizen-manifest.xml says of it, and where it lies.
+struct Package {
+    std::string id;              ///< package id, equal to the id of its application
+    std::string version;         ///< possibly empty
+    std::string label;           ///< the application's name; the id when the manifest gives none
+    std::string icon;            ///< absolute path of the icon; empty when the manifest names none
+    std::string exec;            ///< absolute path of the executable; empty when the manifest names none
+    std::filesystem::path root;  ///< the package's folder; shared resources are in root/shared/res/
+    bool preinstalled = false;   ///< true: part of the build; false: installed on this device
+};
+
+/// Reads `<root>/tizen-manifest.xml`.
+/// Throws Error, naming file and line, when it is missing, no regular file, not well formed, lacks the package
+/// id, gives an application id that differs from the package id, or an id that is no valid bus name.
+Package readManifest(const std::filesystem::path& root);
+
+/// The packages of the device: those that the build ships, read where they lie, as changed by what was
+/// installed and removed on this device. Keeps no copy of anything.
+/// All throw Error when the database fails.
+class Packages {
+public:
+    Packages(Database& database, Events& events, const Folder& folder, std::vector<std::filesystem::path> preinstalled);
+
+    /// The package's folder, without reading its manifest; nullopt when it is not installed.
+    std::optional<std::filesystem::path> rootOf(const std::string& id) const;
+    /// nullopt when it is not installed. Throws Error when its manifest is broken.
+    std::optional<Package> find(const std::string& id) const;
+    /// All packages in the order of their ids; one with a broken manifest is left out.
+    std::vector<Package> all() const;
+
+    /// Copies the package in `source` onto the device and returns it. An installed package of the same id is
+    /// replaced (an update). Publishes started, processing and completed or failed; the copy is in place before
+    /// "completed", and nothing has changed after "failed".
+    /// Throws Error when the manifest is broken or the copy fails.
+    Package install(const std::filesystem::path& source);
+    /// Removes the package from the device, also one that the build ships (which stays where it lies).
+    /// Publishes as install() does. Throws Error when it is not installed.
+    void uninstall(const std::string& id);
+
+private:
+    Database& database_;
+    Events& events_;
+    const Folder& folder_;
+    std::vector<std::filesystem::path> preinstalled_;
+};
+
+}  // namespace device

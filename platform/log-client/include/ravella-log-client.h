@@ -1,0 +1,37 @@
+#pragma once
+
+#include "bundle.h"
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/** A connection to the device's usage-log service. Opaque. */
+typedef struct ravella_log_manager_s* ravella_log_manager_h;
+
+/**
+ * Told, from the main loop, that a record was stored.
+ * @param request_id what ravella_log_manager_insert() gave
+ * @param result TIZEN_ERROR_NONE or why it was not stored
+ */
+typedef void (*ravella_log_insert_cb)(int request_id, int result, void* user_data);
+
+/** @param[out] handle to be freed with ravella_log_manager_destroy() @return 0 or a negative error */
+int ravella_log_manager_create(ravella_log_manager_h* handle);
+
+/**
+ * Stores a record; it is on the device when this returns 0.
+ * @param uri a content URI; its scheme must be "content://"
+ * @param record its strings are copied
+ * @param callback may be NULL
+ * @param[out] request_id may be NULL
+ * @return 0; TIZEN_ERROR_INVALID_PARAMETER; TIZEN_ERROR_IO_ERROR
+ */
+int ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
+                               ravella_log_insert_cb callback, void* user_data, int* request_id);
+
+int ravella_log_manager_destroy(ravella_log_manager_h handle);
+
+#ifdef __cplusplus
+}
+#endif
