@@ -1,8 +1,23 @@
 # EFL by pkg-config, and its theme compiler as a build step.
-pkg_check_modules(ELEMENTARY REQUIRED IMPORTED_TARGET elementary)
-pkg_check_modules(ELDBUS REQUIRED IMPORTED_TARGET eldbus)
-pkg_check_modules(ECORE REQUIRED IMPORTED_TARGET ecore)
-pkg_check_modules(EFREET REQUIRED IMPORTED_TARGET efreet)
+# Debian's files name include folders that no package ships; CMake refuses a target with such a folder.
+function(find_efl_module prefix module)
+  pkg_check_modules(${prefix} REQUIRED IMPORTED_TARGET GLOBAL ${module})
+  get_target_property(folders PkgConfig::${prefix} INTERFACE_INCLUDE_DIRECTORIES)
+  if(folders)
+    set(existing)
+    foreach(folder IN LISTS folders)
+      if(EXISTS "${folder}")
+        list(APPEND existing "${folder}")
+      endif()
+    endforeach()
+    set_target_properties(PkgConfig::${prefix} PROPERTIES INTERFACE_INCLUDE_DIRECTORIES "${existing}")
+  endif()
+endfunction()
+
+find_efl_module(ELEMENTARY elementary)
+find_efl_module(ELDBUS eldbus)
+find_efl_module(ECORE ecore)
+find_efl_module(EFREET efreet)
 find_program(EDJE_CC edje_cc REQUIRED)
 
 # add_edje(<target> OUTPUT <file.edj> SOURCE <main.edc> [IMAGES <dir>] [DEPENDS <file>...])
