@@ -1,0 +1,10 @@
+#pragma once
+
+#include <string>
+
+/// Reports to the platform's usage-log service which tips were used. Failures are ignored.
+class KestUsageLog {
+public:
+    /// A menu was chosen in the main list ("KT01").
+    static void menuChosen(const std::string& menuTitle);
+};

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <libxml/parser.h>
+#include <libxml/tree.h>
+
+#include <memory>
+#include <string>
+
+/// One of the catalogue's XML files, parsed, and what the loaders ask of its nodes. Frees the document with itself.
+class KestXmlDocument {
+public:
+    enum class Result {
+        Ok,
+        NotRead,  ///< not a regular file, or not to be parsed at all
+        Empty     ///< no root element, or a root without children
+    };
+
+    /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened.
+    Result read(const std::string& path);
+
+    /// The first element of that name below the root; null when there is none.
+    xmlNode* findSection(const char* name) const;
+
+    static bool isElement(const xmlNode* node, const char* name);
+    static bool hasName(const xmlNode* node, const char* name);
+
+    /// The node's text, markup inside it dropped, as a string that is freed with xmlFree(); null when it has none.
+    using Text = std::unique_ptr<xmlChar, void (*)(xmlChar*)>;
+    static Text content(xmlNode* node);
+    /// An attribute's value; null when the node has no such attribute.
+    static Text attribute(xmlNode* node, const char* name);
+
+    static std::string str(const Text& text) { return text ? reinterpret_cast<const char*>(text.get()) : ""; }
+
+private:
+    struct FreeDocument {
+        void operator()(xmlDoc* document) const { xmlFreeDoc(document); }
+    };
+    std::unique_ptr<xmlDoc, FreeDocument> document_;
+};

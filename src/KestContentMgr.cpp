@@ -1,0 +1,434 @@
+#include "KestContentMgr.h"
+
+#include "KestCommon.h"
+#include "KestContentCache.h"
+#include "KestLog.h"
+#include "KestPaths.h"
+#include "KestPlatformString.h"
+#include "KestXml.h"
+
+#include <libintl.h>
+#include <package_manager.h>
+#include <unistd.h>
+#include <vconf.h>
+
+namespace {
+
+const char menuFile[] = "contents/kest_menu.xml";
+const char languageKey[] = "db/menu_widget/language";
+const char ownDomain[] = "kest";
+const char systemDomain[] = "sys_string";
+
+/// A translation may bring text tags of its own; past these bounds the text stays as it stands.
+const int mostReplacements = 10000;
+const size_t longestContents = 1024 * 1024;
+
+/// The log's words for a file that could not be used; null when it could.
+const char* failureOf(KestXmlDocument::Result result) {
+    switch (result) {
+    case KestXmlDocument::Result::NotRead:
+        return "Failed to xmlReadFile";
+    case KestXmlDocument::Result::Empty:
+        return "Empty document";
+    case KestXmlDocument::Result::Ok:
+        break;
+    }
+    return nullptr;
+}
+
+bool hasTranslation(const char* domain, const std::string& id) {
+    return id != dgettext(domain, id.c_str());
+}
+
+/// The two prefixes, of five and of two characters, under which the string table knows a display language.
+std::string languagePrefix(const KestPlatformString& language, size_t length) {
+    return language.str().substr(0, length) + "_";
+}
+
+}  // namespace
+
+KestContentMgr* KestContentMgr::getInstance() {
+    static KestContentMgr instance;
+    return &instance;
+}
+
+KestContentMgr::KestContentMgr() {
+    KEST_BEGIN();
+    loadContentsList(false);
+}
+
+KestContentMgr::~KestContentMgr() {
+    KEST_BEGIN();
+}
+
+bool KestContentMgr::loadContentsList(bool force) {
+    KEST_BEGIN();
+    contentsList.clear();
+    if (!__loadMainMenu()) {
+        KEST_INFO("__loadMainMenu failed");
+        return false;
+    }
+    if (!force && __checkCacheAvailable()) {
+        for (KestContentInfo& record : contentsList) {
+            __getFromPreference(record.path, record);
+            record.iconPath = __getIconPath(record.appid);
+        }
+        return true;
+    }
+
+    // Until the load has finished no version is right, so one that is cut short leaves the cache invalid.
+    KestContentCache::writeVersion("");
+    const KestPlatformString language(vconf_get_str(languageKey));
+    if (language) {
+        KestContentCache::writeLanguage(language.str());
+    }
+    for (KestContentInfo& record : contentsList) {
+        if (!__loadDetailMenu(record)) {
+            KEST_INFO("__loadDetailMenu failed : %s", record.appid.empty() ? "Unknown" : record.appid.c_str());
+        }
+    }
+    const std::string version = __getPackageVersion();
+    if (!version.empty()) {
+        KestContentCache::writeVersion(version);
+    }
+    return true;
+}
+
+bool KestContentMgr::__loadMainMenu() {
+    KEST_BEGIN();
+    const std::string path = KestCommon::getSharedResourcePath(KEST_APP_ID) + menuFile;
+    const int accessible = access(path.c_str(), F_OK);
+    if (accessible != 0) {
+        KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
+        return false;
+    }
+    KestXmlDocument document;
+    if (const char* failure = failureOf(document.read(path))) {
+        KEST_ERR("%s", failure);
+        return false;
+    }
+    const xmlNode* menus = document.findSection("menus");
+    for (xmlNode* menu = menus ? menus->children : nullptr; menu; menu = menu->next) {
+        if (KestXmlDocument::isElement(menu, "menu")) {
+            __addMenu(menu);
+        }
+    }
+    return true;
+}
+
+void KestContentMgr::__addMenu(xmlNode* menu) {
+    KestContentInfo record;
+    for (xmlNode* node = menu->children; node; node = node->next) {
+        const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
+        if (KestXmlDocument::hasName(node, "path")) {
+            record.path = text;
+        } else if (KestXmlDocument::hasName(node, "appid")) {
+            record.appid = text;
+        } else if (KestXmlDocument::hasName(node, "state")) {
+            record.isAvailable = text != "NOK" && text.find(KestCommon::getRegion()) != std::string::npos;
+        }
+    }
+    if (!record.isAvailable) {
+        return;
+    }
+    const std::string detailPath = KestCommon::getSharedResourcePath(record.appid) + record.path;
+    if (access(detailPath.c_str(), F_OK) != 0) {
+        KEST_WARN("__loadMainMenu failed : %s", record.appid.c_str());
+        return;
+    }
+    contentsList.push_back(record);
+}
+
+bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
+    KEST_BEGIN();
+    __loadStringResource(record);
+    const std::string path = KestCommon::getSharedResourcePath(record.appid) + record.path;
+    const int accessible = access(path.c_str(), F_OK);
+    if (accessible != 0) {
+        KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
+        return false;
+    }
+    KestXmlDocument document;
+    if (const char* failure = failureOf(document.read(path))) {
+        KEST_ERR("%s", failure);
+        return false;
+    }
+    record.menuTitle = "No Title";
+    record.textContents = "No Contents";
+    record.iconPath = __getIconPath(record.appid);
+
+    const xmlNode* items = document.findSection("items");
+    for (const xmlNode* item = items ? items->children : nullptr; item; item = item->next) {
+        if (!KestXmlDocument::isElement(item, "item")) {
+            continue;
+        }
+        for (xmlNode* node = item->children; node; node = node->next) {
+            __readDetail(node, record);
+        }
+    }
+    __saveToPreference(record);
+    return true;
+}
+
+void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
+    const KestXmlDocument::Text content = KestXmlDocument::content(node);
+    const std::string text = KestXmlDocument::str(content);
+    if (KestXmlDocument::hasName(node, "textdomain")) {
+        record.textdomain = text;
+    } else if (KestXmlDocument::hasName(node, "title")) {
+        std::string id;
+        record.menuTitle = __translateById(node, record.textdomain, text, id);
+        if (!id.empty()) {
+            record.titleId = id;
+        }
+    } else if (KestXmlDocument::hasName(node, "appname")) {
+        std::string id;
+        record.appName = __translateById(node, record.textdomain, text, id);
+    } else if (KestXmlDocument::hasName(node, "image")) {
+        record.imagePath = KestCommon::getSharedResourcePath(record.appid) + text;
+    } else if (KestXmlDocument::hasName(node, "launchappid")) {
+        record.launchAppid = text;
+    } else if (KestXmlDocument::hasName(node, "launchparamkey")) {
+        record.launchParamKey = text;
+    } else if (KestXmlDocument::hasName(node, "launchparamvalue")) {
+        record.launchParamValue = text;
+    } else if (KestXmlDocument::hasName(node, "contents")) {
+        __loadContents(record, text);
+    } else if (KestXmlDocument::hasName(node, "attach")) {
+        const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
+        if (content && id) {
+            const std::string fragment = __convertHrefPath(record.appid, text);
+            record.textContents = __replaceString(record.textContents, KestXmlDocument::str(id), fragment, true);
+        }
+    }
+}
+
+std::string KestContentMgr::__translateById(xmlNode* node, const std::string& domain, const std::string& text,
+                                            std::string& usedId) {
+    const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
+    if (!id || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
+        return text;
+    }
+    usedId = KestXmlDocument::str(id);
+    return __getString(usedId, domain);
+}
+
+void KestContentMgr::__loadContents(KestContentInfo& record, const std::string& text) {
+    std::string contents = text;
+    if (contents.find(record.titleId) != std::string::npos) {
+        KEST_INFO("Old xml style, Need to manipulate");
+        contents = __cleanOldContents(contents);
+    }
+    const std::string translated = __translateContents(record.textdomain, contents);
+    const std::string converted = __convertHrefPath(record.appid, translated);
+    record.textContents = converted.empty() ? text : converted;
+}
+
+std::string KestContentMgr::__cleanOldContents(const std::string& contents) {
+    const std::string icon = __extractString(contents, "<item", "</item>", true);
+    if (icon.empty()) {
+        return contents;
+    }
+    std::string cleaned = __replaceString(contents, icon, "", true);
+    const std::string title = __extractString(cleaned, "<text", "</text>", true);
+    if (title.empty()) {
+        return cleaned;
+    }
+    cleaned = __replaceString(cleaned, title, "", true);
+    cleaned = __replaceString(cleaned, "<br/>", "", false);
+    return __replaceString(cleaned, "<br>", "", false);
+}
+
+std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
+    // The directory begins with a slash itself; the text engine expects both.
+    return __replaceString(text, "href=file:", "href=file:/" + KestCommon::getSharedResourcePath(appid), false);
+}
+
+void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
+    KEST_BEGIN();
+    const std::string detailPath = KestCommon::getSharedResourcePath(record.appid) + record.path;
+    const std::string path = __replaceString(detailPath, ".xml", "-string.xml", true);
+    if (access(path.c_str(), F_OK) != 0) {
+        return;
+    }
+    KEST_INFO("%s use self string resource", record.appid.c_str());
+    KestXmlDocument document;
+    if (const char* failure = failureOf(document.read(path))) {
+        KEST_ERR("%s", failure);
+        return;
+    }
+    const xmlNode* items = document.findSection("items");
+    for (const xmlNode* item = items ? items->children : nullptr; item; item = item->next) {
+        if (KestXmlDocument::isElement(item, "item")) {
+            __addString(item);
+        }
+    }
+}
+
+void KestContentMgr::__addString(const xmlNode* item) {
+    std::string region;
+    std::string stringId;
+    std::string value;
+    for (xmlNode* node = item->children; node; node = node->next) {
+        const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
+        if (KestXmlDocument::hasName(node, "region")) {
+            region = text;
+        } else if (KestXmlDocument::hasName(node, "stringid")) {
+            stringId = text;
+        } else if (KestXmlDocument::hasName(node, "value")) {
+            value = text;
+        }
+    }
+    if (!stringId.empty()) {
+        stringTable[region + "_" + stringId] = value;
+    }
+}
+
+bool KestContentMgr::__isStringAvailable(const std::string& id, const std::string& domain) {
+    // The text of the empty id is the header of the gettext catalogue.
+    if (id.empty()) {
+        return false;
+    }
+    if (hasTranslation(domain.c_str(), id) || hasTranslation(ownDomain, id) || hasTranslation(systemDomain, id)) {
+        return true;
+    }
+    const KestPlatformString language(vconf_get_str(languageKey));
+    return language && (stringTable.count(languagePrefix(language, 5) + id) > 0 ||
+                        stringTable.count(languagePrefix(language, 2) + id) > 0);
+}
+
+std::string KestContentMgr::__getString(const std::string& id, const std::string& domain) {
+    bindtextdomain(domain.c_str(), kest_paths::locale);
+    if (hasTranslation(ownDomain, id)) {
+        return dgettext(ownDomain, id.c_str());
+    }
+    bindtextdomain(domain.c_str(), kest_paths::systemLocale);
+    if (hasTranslation(domain.c_str(), id)) {
+        return dgettext(domain.c_str(), id.c_str());
+    }
+    if (hasTranslation(systemDomain, id)) {
+        return dgettext(systemDomain, id.c_str());
+    }
+    const KestPlatformString language(vconf_get_str(languageKey));
+    if (!language) {
+        return id;
+    }
+    auto entry = stringTable.find(languagePrefix(language, 5) + id);
+    if (entry == stringTable.end()) {
+        entry = stringTable.find(languagePrefix(language, 2) + id);
+    }
+    return entry == stringTable.end() ? id : entry->second;
+}
+
+std::string KestContentMgr::__translateContents(const std::string& domain, std::string contents) {
+    const std::string lineBreak = "<font_size=16><br/></>";
+    for (int replacements = 0;; ++replacements) {
+        const std::string tag = __extractString(contents, "<text", "</text>", true);
+        if (tag.empty()) {
+            return contents;
+        }
+        if (replacements == mostReplacements || contents.size() > longestContents) {
+            KEST_INFO("xml contents error: text id string part");
+            return contents;
+        }
+        const std::string id = __extractString(tag, "id=\"", "\">", false);
+        if (id.empty()) {
+            KEST_INFO("xml contents error: text id string part");
+            return __extractString(tag, ">", "<", false);
+        }
+        std::string value = __getString(id, domain);
+        value = __replaceString(value, "\n", lineBreak, false);
+        value = __replaceString(value, "\\n", lineBreak, false);
+        value = __replaceString(value, "&", "&amp;", false);
+        contents = __replaceString(contents, tag, value, false);
+    }
+}
+
+std::string KestContentMgr::__replaceString(const std::string& text, const std::string& from, const std::string& to,
+                                            bool firstOnly) {
+    std::string result;
+    size_t copied = 0;
+    size_t found = text.find(from);
+    while (found != std::string::npos) {
+        result.append(text, copied, found - copied).append(to);
+        copied = found + from.size();
+        found = firstOnly || from.empty() ? std::string::npos : text.find(from, copied);
+    }
+    return result.append(text, copied, std::string::npos);
+}
+
+std::string KestContentMgr::__extractString(const std::string& text, const std::string& start, const std::string& end,
+                                            bool inclusive) {
+    const size_t found = text.find(start);
+    if (found == std::string::npos) {
+        return "";
+    }
+    const size_t from = inclusive ? found : found + start.size();
+    const size_t last = text.find(end, from);
+    if (last == std::string::npos) {
+        return "";
+    }
+    return text.substr(from, last - from + (inclusive ? end.size() : 0));
+}
+
+bool KestContentMgr::__checkCacheAvailable() {
+    std::string cachedLanguage;
+    if (!KestContentCache::readLanguage(cachedLanguage)) {
+        return false;
+    }
+    const KestPlatformString language(vconf_get_str(languageKey));
+    if (!language || language.str() != cachedLanguage) {
+        KEST_INFO("Language changed");
+        return false;
+    }
+    std::string cachedVersion;
+    if (KestContentCache::readVersion(cachedVersion) && cachedVersion != __getPackageVersion()) {
+        KEST_INFO("Version changed!!");
+        return false;
+    }
+    return true;
+}
+
+std::string KestContentMgr::__getPackageVersion() {
+    package_info_h info = nullptr;
+    if (package_manager_get_package_info(KEST_APP_ID, &info) != PACKAGE_MANAGER_ERROR_NONE) {
+        KEST_WARN("package_manager_get_package_info error");
+        return "";
+    }
+    KestPlatformString version;
+    package_info_get_version(info, version.out());
+    package_info_destroy(info);
+    return version.str();
+}
+
+std::string KestContentMgr::__getIconPath(const std::string& appid) {
+    if (appid.empty()) {
+        return "";
+    }
+    package_info_h info = nullptr;
+    int result = package_info_create(appid.c_str(), &info);
+    if (result != PACKAGE_MANAGER_ERROR_NONE) {
+        KEST_ERR("package_info_create return [%d]", result);
+        package_info_destroy(info);
+        return "No icon Path";
+    }
+    KestPlatformString icon;
+    result = package_info_get_icon(info, icon.out());
+    if (result != PACKAGE_MANAGER_ERROR_NONE || !icon) {
+        KEST_ERR("pkgmgrinfo_appinfo_get_icon return [%d]", result);
+        package_info_destroy(info);
+        return "No icon Path";
+    }
+    package_info_destroy(info);
+    return icon.str();
+}
+
+void KestContentMgr::__saveToPreference(const KestContentInfo& record) {
+    KEST_HIT();
+    KestContentCache::save(record);
+}
+
+void KestContentMgr::__getFromPreference(const std::string& path, KestContentInfo& record) {
+    KEST_HIT();
+    KestContentCache::load(path, record);
+}
