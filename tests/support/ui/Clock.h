@@ -1,0 +1,30 @@
+#pragma once
+
+#include <functional>
+
+/// The test's own clock in place of the machine's: timers, animators and transitions run at once, in their order,
+/// and the same way at every run.
+namespace test_ui::clock {
+
+/// Replaces the clock. To be called before EFL starts.
+void start();
+/// Has EFL's main loop wait on this clock. To be called when EFL has started.
+void driveMainLoop();
+/// Has animations tick on this clock, 60 times a second. Every new window needs it again; runFor() does it.
+void driveAnimations();
+/// Forgets what belongs to a main loop that is about to end.
+void stop();
+
+/// Milliseconds, as input events carry them.
+unsigned int timestamp();
+
+}  // namespace test_ui::clock
+
+namespace test_ui {
+
+/// Lets the main loop run for `seconds` of the test's clock, or until the application ends it.
+void runFor(double seconds);
+/// Lets the main loop run until `condition` holds; false when it still does not after `seconds`.
+bool runUntil(const std::function<bool()>& condition, double seconds = 5.0);
+
+}  // namespace test_ui

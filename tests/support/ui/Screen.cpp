@@ -1,0 +1,73 @@
+#include "ui/Screen.h"
+
+#include "ui/Clock.h"
+
+#include <Ecore_Evas.h>
+
+namespace test_ui {
+
+Rect geometry(const Evas_Object* object) {
+    Rect rect;
+    evas_object_geometry_get(object, &rect.x, &rect.y, &rect.width, &rect.height);
+    return rect;
+}
+
+void Screen::press(Point at) {
+    evas_event_feed_mouse_in(canvas(), clock::timestamp(), nullptr);
+    moveTo(at);
+    evas_event_feed_mouse_down(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr);
+}
+
+void Screen::moveTo(Point to) {
+    evas_event_feed_mouse_move(canvas(), to.x, to.y, clock::timestamp(), nullptr);
+}
+
+void Screen::lift() {
+    evas_event_feed_mouse_up(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr);
+}
+
+void Screen::tap(Point at, double hold) {
+    press(at);
+    runFor(hold);
+    lift();
+    // What a tap sets off by way of edje's signals comes with the next turn of the loop.
+    runFor(0.01);
+}
+
+void Screen::swipe(Point from, Point to, double seconds) {
+    constexpr int steps = 10;
+    press(from);
+    for (int step = 1; step <= steps; ++step) {
+        runFor(seconds / steps);
+        moveTo({from.x + (to.x - from.x) * step / steps, from.y + (to.y - from.y) * step / steps});
+    }
+    lift();
+}
+
+void Screen::key(const std::string& name) {
+    if (!focused_)
+        takeFocus();
+    evas_event_feed_key_down(canvas(), name.c_str(), name.c_str(), nullptr, nullptr, clock::timestamp(), nullptr);
+    evas_event_feed_key_up(canvas(), name.c_str(), name.c_str(), nullptr, nullptr, clock::timestamp(), nullptr);
+    runFor(0.01);
+}
+
+/// A window in memory says that it has the focus, but its focus manager was never told.
+void Screen::takeFocus() {
+    Ecore_Evas* frame = ecore_evas_ecore_evas_get(canvas());
+    ecore_evas_focus_set(frame, EINA_FALSE);
+    runFor(0.1);
+    ecore_evas_focus_set(frame, EINA_TRUE);
+    runFor(0.2);
+    focused_ = true;
+}
+
+Picture Screen::picture() {
+    Ecore_Evas* frame = ecore_evas_ecore_evas_get(canvas());
+    ecore_evas_manual_render(frame);
+    int width = 0, height = 0;
+    ecore_evas_geometry_get(frame, nullptr, nullptr, &width, &height);
+    return Picture(width, height, static_cast<const unsigned int*>(ecore_evas_buffer_pixels_get(frame)));
+}
+
+}  // namespace test_ui
