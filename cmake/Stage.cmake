@@ -27,7 +27,7 @@ function(stage_tree target)
 endfunction()
 
 # stage_texts(<target> FROM <dir> TO <dir>)
-# Compiles FROM/<language>/LC_MESSAGES/<domain>.po to TO/<language>/LC_MESSAGES/<domain>.mo.
+# Compiles FROM/<language>/LC_MESSAGES/<domain>.po to TO/<language>/LC_MESSAGES/<domain>.mo. An unsafe format fails.
 function(stage_texts target)
   cmake_parse_arguments(ARG "" "FROM;TO" "" ${ARGN})
   file(GLOB_RECURSE files CONFIGURE_DEPENDS RELATIVE "${ARG_FROM}" "${ARG_FROM}/*.po")
@@ -38,6 +38,8 @@ function(stage_texts target)
     add_custom_command(
       OUTPUT "${ARG_TO}/${compiled}"
       COMMAND "${CMAKE_COMMAND}" -E make_directory "${directory}"
+      COMMAND "${CMAKE_COMMAND}" -D "TEXTS=${ARG_FROM}/${file}" -D "MSGFMT=${MSGFMT}"
+              -P "${CMAKE_CURRENT_FUNCTION_LIST_DIR}/CheckFormats.cmake"
       COMMAND "${MSGFMT}" --check -o "${ARG_TO}/${compiled}" "${ARG_FROM}/${file}"
       DEPENDS "${ARG_FROM}/${file}" VERBATIM)
     list(APPEND outputs "${ARG_TO}/${compiled}")
