@@ -1,0 +1,29 @@
+#pragma once
+
+#include "support/TemporaryDevice.h"
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+namespace bench {
+
+/// A device of its own with a catalogue of `menus` menus about ten applications, every file of the size and the
+/// make of those that ship: a page of five texts, translated by a string file with three languages.
+/// It is the process's device while it lives, and its files go with it.
+class Catalogue {
+public:
+    explicit Catalogue(int menus);
+
+    /// The catalogue's files in the order in which a full load reads them.
+    const std::vector<std::filesystem::path>& files() const { return files_; }
+    support::TemporaryDevice& device() { return device_; }
+
+private:
+    void addPage(int number, const std::string& appId);
+
+    support::TemporaryDevice device_;
+    std::vector<std::filesystem::path> files_;
+};
+
+}  // namespace bench

@@ -1,0 +1,162 @@
+// What starting the application costs beside a bare EFL window with one list: the time from the start of the process
+// to the first frame with rows in it, and the most memory up to there. Whole processes that draw into memory, in turn,
+// medians. Joins the bus of its environment as the application does: to be run under one of its own.
+
+#include "support/TemporaryFolder.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdio>
+#include <cstdlib>
+#include <ctime>
+#include <fcntl.h>
+#include <filesystem>
+#include <stdexcept>
+#include <string>
+#include <sys/wait.h>
+#include <unistd.h>
+#include <vector>
+
+namespace {
+
+struct FirstFrame {
+    timespec time;
+    long peakKilobytes;
+};
+
+struct Sample {
+    double milliseconds;
+    double megabytes;
+};
+
+double milliseconds(const timespec& time) {
+    return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_nsec) / 1e6;
+}
+
+[[noreturn]] void become(const std::vector<std::string>& command, int told) {
+    setenv("FIRST_FRAME_FD", std::to_string(told).c_str(), 1);
+    setenv("LD_PRELOAD", FIRST_FRAME, 1);
+    std::vector<char*> arguments;
+    for (const std::string& word : command) {
+        arguments.push_back(const_cast<char*>(word.c_str()));
+    }
+    arguments.push_back(nullptr);
+    const int silence = open("/dev/null", O_WRONLY);
+    dup2(silence, STDOUT_FILENO);
+    dup2(silence, STDERR_FILENO);
+    execv(arguments[0], arguments.data());
+    _exit(127);
+}
+
+Sample start(const std::vector<std::string>& command) {
+    int told[2];
+    if (pipe(told) != 0) {
+        throw std::runtime_error("no pipe");
+    }
+    timespec begin{};
+    clock_gettime(CLOCK_MONOTONIC, &begin);
+    const pid_t process = fork();
+    if (process == 0) {
+        close(told[0]);
+        become(command, told[1]);
+    }
+    close(told[1]);
+    FirstFrame frame{};
+    const bool read = ::read(told[0], &frame, sizeof frame) == sizeof frame;
+    close(told[0]);
+    int status = 0;
+    waitpid(process, &status, 0);
+    if (!read) {
+        throw std::runtime_error(command.front() + " ended before its first frame");
+    }
+    return {milliseconds(frame.time) - milliseconds(begin), static_cast<double>(frame.peakKilobytes) / 1024};
+}
+
+double median(std::vector<double> values) {
+    std::sort(values.begin(), values.end());
+    return values[values.size() / 2];
+}
+
+struct Case {
+    const char* name;
+    std::vector<std::string> command;
+    bool freshDevice;
+    std::vector<Sample> samples;
+
+    double milliseconds() const {
+        std::vector<double> all;
+        for (const Sample& sample : samples) {
+            all.push_back(sample.milliseconds);
+        }
+        return median(all);
+    }
+    double megabytes() const {
+        std::vector<double> all;
+        for (const Sample& sample : samples) {
+            all.push_back(sample.megabytes);
+        }
+        return median(all);
+    }
+};
+
+void prepareEnvironment(const std::filesystem::path& folder) {
+    std::filesystem::create_directories(folder / "home");
+    std::filesystem::create_directories(folder / "run");
+    std::filesystem::permissions(folder / "run", std::filesystem::perms::owner_all);
+    setenv("HOME", (folder / "home").c_str(), 1);
+    setenv("XDG_RUNTIME_DIR", (folder / "run").c_str(), 1);
+    setenv("KEST_DEVICE", (folder / "device").c_str(), 1);
+    setenv("ELM_ENGINE", "buffer", 1);
+    setenv("LANG", "C.UTF-8", 1);
+    unsetenv("DISPLAY");
+    unsetenv("WAYLAND_DISPLAY");
+}
+
+void print(const std::array<Case, 3>& cases) {
+    const Case& bare = cases[0];
+    std::printf("%-34s %10s %8s %10s %8s\n", "start to the first frame with rows", "ms", "ratio", "peak MB", "ratio");
+    for (const Case& each : cases) {
+        std::printf("%-34s %10.1f %8.2f %10.1f %8.2f\n", each.name, each.milliseconds(),
+                    each.milliseconds() / bare.milliseconds(), each.megabytes(), each.megabytes() / bare.megabytes());
+    }
+}
+
+int run(int rounds) {
+    const support::TemporaryFolder folder;
+    prepareEnvironment(folder.path());
+    const std::string picture = std::filesystem::path(APPLICATION).parent_path().parent_path() /
+                                "shared/res/contents/contents_not_released.png";
+    std::array<Case, 3> cases = {Case{"bare window with a list", {BARE_WINDOW, picture}, false, {}},
+                                 Case{"application (aim: 1.30)", {APPLICATION}, false, {}},
+                                 Case{"application, its device's first start", {APPLICATION}, true, {}}};
+    // The first round fills the caches of the disk and of the fonts, and is not counted.
+    for (int round = 0; round <= rounds; ++round) {
+        for (Case& each : cases) {
+            if (each.freshDevice) {
+                setenv("KEST_DEVICE", (folder.path() / ("fresh" + std::to_string(round))).c_str(), 1);
+            }
+            const Sample sample = start(each.command);
+            setenv("KEST_DEVICE", (folder.path() / "device").c_str(), 1);
+            if (round > 0) {
+                each.samples.push_back(sample);
+            }
+        }
+    }
+    print(cases);
+    return 0;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    try {
+        const int rounds = argc > 1 ? std::atoi(argv[1]) : 41;
+        if (rounds < 1) {
+            throw std::runtime_error("usage: startup-bench [ROUNDS]");
+        }
+        return run(rounds);
+    } catch (const std::exception& failure) {
+        std::fprintf(stderr, "startup-bench: %s\n", failure.what());
+        return 1;
+    }
+}
