@@ -6,7 +6,7 @@
 
 namespace remote_control {
 
-/// What is on the window, as JSON: {"title", "width", "height", "elements": [...]}. docs/kest-device.md
+/// What is on the window, as JSON: {"title", "width", "height", "elements": [...]}. The manual of the command line
 /// describes the members.
 std::string treeOf(Evas_Object* window);
 

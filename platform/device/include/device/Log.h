@@ -8,7 +8,7 @@ namespace device {
 
 /// The device's log: a text file, one line a call, appended whole so that processes can share it:
 ///
-///     2026-01-31 12:00:00.123 I KEST(4711) message
+///     2026-01-31 12:00:00.123 I TAG(4711) message
 ///
 /// Levels are D, I, W, E, F. A line break in the message is written as "\n", other control characters but the
 /// escape that begins a colour as "\xNN". Lines also go to standard error when that is a terminal.
