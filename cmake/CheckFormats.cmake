@@ -13,5 +13,6 @@ execute_process(COMMAND "${MSGFMT}" --check-format -o /dev/null "${copy}" RESULT
 file(REMOVE "${copy}")
 if(NOT status EQUAL 0)
   string(REPLACE "${copy}" "${TEXTS}" errors "${errors}")
-  message(FATAL_ERROR "${errors}")
+  message(NOTICE "${errors}")
+  message(FATAL_ERROR "A translation is no safe format.")
 endif()
