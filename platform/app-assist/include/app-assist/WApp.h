@@ -19,8 +19,9 @@ public:
     /// Makes the process an application of the device (its language, text domain, display, theme and bus), runs
     /// onStart, onCreate, the first onAppControl from inside the main loop, and the main loop until it ends,
     /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request.
-    /// Returns the process's exit status: 0, or 1 when the device cannot be opened or onCreate returned false
-    /// (said on standard error).
+    /// Returns the process's exit status: 0; 1 when the device cannot be opened, when the bus has another device,
+    /// or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on standard error.
+    /// An application that is running already on the same device is said too, and gives 0.
     int start(int argc, char** argv);
 
     /// Takes the window over and creates it. The window ends the application when it is closed.
@@ -36,6 +37,8 @@ protected:
     /// False ends the application with status 1.
     virtual bool onCreate();
     virtual void onTerminate();
+    /// The window is out of sight (put away), or in sight again. Also around the main loop: in sight after the
+    /// first launch request, out of sight before onTerminate.
     virtual void onPause();
     virtual void onResume();
     /// A launch request. `request` is freed by the framework afterwards.

@@ -2,11 +2,19 @@
 
 #include "app-assist/WUIObject.h"
 
+#include <Elementary.h>
+
+#include <memory>
+#include <string>
+#include <vector>
+
 namespace app_assist {
 
+class BackKeys;
 class WView;
 
 /// A stack of views of which the top one shows. Owns the views that were pushed.
+/// The device's back key pops the top view, wherever the focus is; on the last view it ends the application.
 class WNaviframe : public WUIObject {
 public:
     WNaviframe();
@@ -25,8 +33,32 @@ public:
     WView* getTopView() const;
     bool isTopView(const WView* view) const { return view && getTopView() == view; }
 
+    /// What the back key does.
+    void back();
+
 private:
+    friend class WView;
+
+    bool putOnStack(WView& view, const char* title, void* viewParam);
+    void adopt(WView& view, Elm_Object_Item* item);
+    void viewGone(const WView& view);
+    void announceTop();
+    void deleteEmptyItems();
+    WView* viewOf(const Elm_Object_Item* item) const;
+
+    static Eina_Bool itemPops(void* naviframe, Elm_Object_Item* item);
+    static void itemGone(void*, Evas_Object* naviframe, void* item);
+    static void evasObjectGoes(void* naviframe, Evas*, Evas_Object*, void*);
+
     Evas_Object* naviframe_ = nullptr;
+    std::unique_ptr<BackKeys> backKeys_;
+    std::vector<WView*> views_;
+    /// Items on the stack whose views are gone.
+    std::vector<Elm_Object_Item*> emptyItems_;
+    Ecore_Job* emptyItemsJob_ = nullptr;
+    const WView* announced_ = nullptr;
+    bool popAsked_ = false;
+    bool backWaits_ = false;
 };
 
 }  // namespace app_assist

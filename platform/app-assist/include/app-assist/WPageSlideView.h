@@ -32,9 +32,19 @@ protected:
     virtual void onInitScroller(Evas_Object* scroller);
 
 private:
+    friend class WView;
+
+    bool putInRow(WView& page);
+    void pageGone(const WView& page);
+    void show(int index);
+    static void layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* view);
+    static void scrollerResized(void* view, Evas*, Evas_Object*, void*);
+
     bool showScroll_ = false;
     Evas_Object* scroller_ = nullptr;
     Evas_Object* row_ = nullptr;
+    /// The page to show when the scroller gets its size; -1 for none.
+    int waitingPage_ = -1;
     std::vector<WView*> pages_;
 };
 

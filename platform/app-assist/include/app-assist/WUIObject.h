@@ -23,7 +23,7 @@ public:
 private:
     friend class WWindow;
     friend class WNaviframe;
-    friend class WView;
+    friend class WPageSlideView;
     WWindow* window_ = nullptr;
 };
 

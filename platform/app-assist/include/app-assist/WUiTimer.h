@@ -32,6 +32,7 @@ public:
     WUiTimer& operator=(const WUiTimer&) = delete;
 
 private:
+    friend class UiTimers;
     struct State;
     explicit WUiTimer(std::unique_ptr<State> state);
     std::unique_ptr<State> state_;

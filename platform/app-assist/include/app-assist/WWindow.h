@@ -10,7 +10,8 @@ namespace app_assist {
 
 class WUIObject;
 
-/// The application's window. Owns its Evas object and its base UI object.
+/// The application's window, which is the device's display: as large as that, and never of another size. Owns its
+/// Evas object and its base UI object. Its end, by whatever way, ends the main loop.
 class WWindow {
 public:
     WWindow(const char* name, Elm_Win_Type type);
@@ -34,6 +35,9 @@ public:
 private:
     friend class WApp;
     void create();
+    void fitBase();
+    static void evasObjectGoes(void* window, Evas*, Evas_Object*, void*);
+    static void resized(void* window, Evas*, Evas_Object*, void*);
 
     std::string name_;
     Elm_Win_Type type_;

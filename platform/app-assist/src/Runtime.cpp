@@ -1,0 +1,177 @@
+#include "Runtime.h"
+
+#include "AppEvents.h"
+#include "Guarded.h"
+#include "UiTimers.h"
+
+#include <app-assist/WWindow.h>
+#include <device/Error.h>
+#include <device/Keys.h>
+#include <efl-answers/DisplayLanguage.h>
+#include <uxt/Theme.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <stdexcept>
+#include <string>
+
+#include <errno.h>
+#include <unistd.h>
+
+namespace app_assist {
+
+namespace {
+
+void say(const std::string& line) {
+    std::fprintf(stderr, "%s: %s\n", program_invocation_short_name, line.c_str());
+}
+
+void sayError(const std::string& line) {
+    say("error: " + line);
+}
+
+/// "com.example.app" gives "app": the domain of the application's own texts.
+std::string textDomain(const std::string& appId) {
+    return appId.substr(appId.rfind('.') + 1);
+}
+
+bool isSet(const char* variable) {
+    const char* value = std::getenv(variable);
+    return value && *value;
+}
+
+std::string whyNoWindow() {
+    if (isSet("DISPLAY") || isSet("WAYLAND_DISPLAY") || isSet("ELM_ENGINE"))
+        return "no window could be made on the display";
+    return "there is no display to show a window on (DISPLAY and WAYLAND_DISPLAY are not set); "
+           "ELM_ENGINE=buffer draws into memory";
+}
+
+}  // namespace
+
+Runtime::~Runtime() {
+    end();
+}
+
+std::optional<int> Runtime::begin(int argc, char** argv) {
+    try {
+        extras_ = LaunchRequest::parse(argc, argv);
+    } catch (const std::invalid_argument& error) {
+        sayError(error.what());
+        return 2;
+    }
+    try {
+        device_ = &device::Device::current();
+        startToolkit(argc, argv);
+        if (!createApplication(argc, argv)) {
+            sayError("the application could not start");
+            return 1;
+        }
+        return joinBus();
+    } catch (const std::exception& error) {
+        sayError(error.what());
+        return 1;
+    }
+}
+
+void Runtime::startToolkit(int argc, char** argv) {
+    const device::Application& application = device_->application();
+    // Where a device's launcher starts applications; pictures in texts are named relative to it.
+    if (chdir("/") != 0)
+        throw device::Error("/: cannot change to this folder");
+    DisplayLanguage::bindTexts(textDomain(application.id), application.root / "res/locale");
+    DisplayLanguage::bindTexts("sys_string", device_->data() / "locale");
+    toolkit_.emplace(*device_, messages_, argc, argv);
+    // After EFL, which sets a locale of its own when it starts.
+    useLanguage();
+    useTheme();
+    windowAhead_.emplace();
+    if (!windowAhead_->exists())
+        sayError(whyNoWindow());
+}
+
+bool Runtime::createApplication(int argc, char** argv) {
+    followDevice();
+    app_.onStart(argc, argv);
+    created_ = app_.onCreate();
+    return created_;
+}
+
+std::optional<int> Runtime::joinBus() {
+    const auto window = [this]() -> Evas_Object* {
+        return app_.getWindow() ? app_.getWindow()->getEvasObj() : nullptr;
+    };
+    presence_.emplace(*device_, window, [] { elm_exit(); });
+    switch (presence_->result()) {
+    case BusPresence::Result::OtherDevice:
+        sayError("the bus belongs to the device in " + presence_->otherFolder() + ", not to the one in " +
+                 device_->folder().root().string() + "; give each device a bus of its own");
+        return 1;
+    case BusPresence::Result::RunningAlready:
+        say(device_->application().id + " is running already");
+        return 0;
+    case BusPresence::Result::NoBus:
+        say("there is no bus: remote control is off");
+        break;
+    case BusPresence::Result::Joined:
+        break;
+    }
+    // From inside the main loop, so that it can end the application.
+    firstRequest_ = ecore_job_add(
+        [](void* data) {
+            auto* self = static_cast<Runtime*>(data);
+            self->firstRequest_ = nullptr;
+            guarded("a launch request", [self] { self->deliver(self->extras_); });
+        },
+        this);
+    return std::nullopt;
+}
+
+void Runtime::deliver(const LaunchRequest::Extras& extras) {
+    const LaunchRequest request(device_->application().id, extras);
+    const bool first = std::exchange(firstLaunch_, false);
+    app_.onAppControl(request.handle(), first);
+    if (first)
+        app_.onResume();
+}
+
+void Runtime::followDevice() {
+    settings_ = device_->events().onSetting(
+        [this](const std::string& key) { guarded("a setting's change", [&] { settingChanged(key); }); });
+}
+
+void Runtime::settingChanged(const std::string& key) {
+    if (key == device::keys::language) {
+        useLanguage();
+        AppEvents::dispatch(APP_EVENT_LANGUAGE_CHANGED);
+    } else if (key == device::keys::theme) {
+        useTheme();
+        uxt::themeChanged();
+    }
+}
+
+void Runtime::useLanguage() const {
+    DisplayLanguage(device_->language()).use();
+}
+
+void Runtime::useTheme() const {
+    uxt::applyDeviceTheme(device_->settings().get(device::keys::theme).value_or(device::keys::defaultTheme) == "dark");
+}
+
+void Runtime::end() {
+    if (firstRequest_)
+        ecore_job_del(std::exchange(firstRequest_, nullptr));
+    if (!firstLaunch_)
+        guarded("onPause", [this] { app_.onPause(); });
+    if (std::exchange(created_, false))
+        guarded("onTerminate", [this] { app_.onTerminate(); });
+    settings_.reset();
+    presence_.reset();
+    app_.window_.reset();
+    UiTimers::endAll();
+    windowAhead_.reset();
+    toolkit_.reset();
+    device_ = nullptr;
+}
+
+}  // namespace app_assist

@@ -1,0 +1,53 @@
+#pragma once
+
+#include "BusPresence.h"
+#include "DisplayWindow.h"
+#include "LaunchRequest.h"
+#include "Toolkit.h"
+
+#include <app-assist/WApp.h>
+#include <device/Device.h>
+
+#include <optional>
+
+namespace app_assist {
+
+/// One run of an application, in steps: what stands between a process and the application object in it.
+class Runtime {
+public:
+    explicit Runtime(WApp& app, Toolkit::Messages messages = Toolkit::Messages::InLog)
+        : app_(app), messages_(messages) {}
+    /// Ends what was begun.
+    ~Runtime();
+    Runtime(const Runtime&) = delete;
+    Runtime& operator=(const Runtime&) = delete;
+
+    /// Everything up to the main loop, which then delivers the first launch request. nullopt when the main loop may
+    /// run, else the process's exit status; why is said on standard error.
+    std::optional<int> begin(int argc, char** argv);
+    void end();
+
+private:
+    void startToolkit(int argc, char** argv);
+    bool createApplication(int argc, char** argv);
+    std::optional<int> joinBus();
+    void deliver(const LaunchRequest::Extras& extras);
+    void followDevice();
+    void settingChanged(const std::string& key);
+    void useLanguage() const;
+    void useTheme() const;
+
+    WApp& app_;
+    Toolkit::Messages messages_;
+    device::Device* device_ = nullptr;
+    std::optional<Toolkit> toolkit_;
+    std::optional<PreinitializedWindow> windowAhead_;
+    std::optional<BusPresence> presence_;
+    device::Events::Subscription settings_;
+    LaunchRequest::Extras extras_;
+    Ecore_Job* firstRequest_ = nullptr;
+    bool created_ = false;
+    bool firstLaunch_ = true;
+};
+
+}  // namespace app_assist

@@ -1,0 +1,59 @@
+#include "app-assist/WApp.h"
+
+#include "Runtime.h"
+#include "app-assist/WWindow.h"
+
+namespace app_assist {
+
+namespace {
+
+WApp* instance = nullptr;
+
+}  // namespace
+
+WApp::WApp() {
+    instance = this;
+}
+
+WApp::~WApp() {
+    if (instance == this)
+        instance = nullptr;
+}
+
+WApp* WApp::getInstance() {
+    return instance;
+}
+
+int WApp::start(int argc, char** argv) {
+    Runtime runtime(*this);
+    if (const auto status = runtime.begin(argc, argv))
+        return *status;
+    elm_run();
+    return 0;
+}
+
+void WApp::attachWindow(WWindow* window) {
+    window_.reset(window);
+    if (window)
+        window->create();
+}
+
+WWindow* WApp::getWindow() const {
+    return window_.get();
+}
+
+void WApp::onStart(int, char**) {}
+
+bool WApp::onCreate() {
+    return true;
+}
+
+void WApp::onTerminate() {}
+
+void WApp::onPause() {}
+
+void WApp::onResume() {}
+
+void WApp::onAppControl(app_control_h, bool) {}
+
+}  // namespace app_assist

@@ -1,0 +1,184 @@
+#include "app-assist/WNaviframe.h"
+
+#include "BackKeys.h"
+#include "Guarded.h"
+#include "app-assist/WView.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace app_assist {
+
+namespace {
+
+/// Under this name the Evas object knows its WNaviframe.
+constexpr char selfKey[] = "app_assist::WNaviframe";
+
+}  // namespace
+
+WNaviframe::WNaviframe() = default;
+
+WNaviframe::~WNaviframe() {
+    destroy();
+    if (emptyItemsJob_)
+        ecore_job_del(emptyItemsJob_);
+    for (WView* view : views_)
+        view->naviframe_ = nullptr;
+}
+
+bool WNaviframe::create(Evas_Object* parent, void*) {
+    naviframe_ = elm_naviframe_add(parent);
+    if (!naviframe_)
+        return false;
+    evas_object_data_set(naviframe_, selfKey, this);
+    evas_object_event_callback_add(naviframe_, EVAS_CALLBACK_DEL, evasObjectGoes, this);
+    evas_object_smart_callback_add(
+        naviframe_, "item,activated",
+        [](void* self, Evas_Object*, void*) { static_cast<WNaviframe*>(self)->announceTop(); }, this);
+    evas_object_smart_callback_add(
+        naviframe_, "transition,finished",
+        [](void* data, Evas_Object*, void*) {
+            auto* self = static_cast<WNaviframe*>(data);
+            if (std::exchange(self->backWaits_, false))
+                self->back();
+        },
+        this);
+    backKeys_ = std::make_unique<BackKeys>(evas_object_evas_get(naviframe_), [this] { back(); });
+    return true;
+}
+
+void WNaviframe::destroy() {
+    if (naviframe_)
+        evas_object_del(naviframe_);
+}
+
+// Its items, and with them the views, go after this.
+void WNaviframe::evasObjectGoes(void* data, Evas*, Evas_Object* object, void*) {
+    auto* self = static_cast<WNaviframe*>(data);
+    evas_object_data_del(object, selfKey);
+    self->backKeys_.reset();
+    self->naviframe_ = nullptr;
+    for (WView* view : self->views_)
+        view->naviItem_ = nullptr;
+}
+
+void WNaviframe::push(WView* view, const char* title, void* viewParam) {
+    if (!view)
+        return;
+    view->window_ = window_;
+    view->naviframe_ = this;
+    views_.push_back(view);
+    const std::weak_ptr<void> life = view->life();
+    if (putOnStack(*view, title, viewParam) || life.expired())
+        return;
+    dlog_print(DLOG_ERROR, logTag, "the view %s could not be pushed", view->getClassName());
+    // Deleting the Evas object first has the view told by onDestroy().
+    view->giveAway();
+    view->destroy();
+    if (!life.expired())
+        delete view;
+}
+
+/// False when the view is not on the stack, for whatever reason; it may have been deleted then.
+bool WNaviframe::putOnStack(WView& view, const char* title, void* viewParam) {
+    if (!naviframe_)
+        return false;
+    const std::weak_ptr<void> life = view.life();
+    if (!view.create(naviframe_, viewParam))
+        return false;
+    view.onSetContainerProperties(naviframe_);
+    Elm_Object_Item* item = view.onPushToNaviframe(naviframe_);
+    if (life.expired() || !item)
+        return false;
+    adopt(view, item);
+    if (title)
+        elm_object_item_text_set(item, title);
+    view.onPushed(item);
+    if (!life.expired())
+        announceTop();
+    return true;
+}
+
+void WNaviframe::adopt(WView& view, Elm_Object_Item* item) {
+    view.naviItem_ = item;
+    view.giveAway();
+    elm_naviframe_item_pop_cb_set(item, itemPops, this);
+    elm_object_item_del_cb_set(item, itemGone);
+}
+
+Eina_Bool WNaviframe::itemPops(void* data, Elm_Object_Item* item) {
+    auto* self = static_cast<WNaviframe*>(data);
+    self->popAsked_ = true;
+    bool pops = false;
+    guarded("a view's onPop", [&] {
+        WView* view = self->viewOf(item);
+        pops = !view || view->onPop();
+    });
+    if (pops && self->naviframe_ && elm_naviframe_bottom_item_get(self->naviframe_) == item) {
+        elm_exit();
+        return EINA_FALSE;
+    }
+    return pops;
+}
+
+void WNaviframe::itemGone(void*, Evas_Object* naviframe, void* item) {
+    auto* self = static_cast<WNaviframe*>(evas_object_data_get(naviframe, selfKey));
+    if (!self)
+        return;
+    std::erase(self->emptyItems_, item);
+    if (WView* view = self->viewOf(static_cast<Elm_Object_Item*>(item)))
+        view->naviItem_ = nullptr;
+}
+
+void WNaviframe::viewGone(const WView& view) {
+    std::erase(views_, &view);
+    if (announced_ == &view)
+        announced_ = nullptr;
+    if (!naviframe_ || !view.naviItem_)
+        return;
+    // The item is either about to go with its view, or it stays behind without content and must go too.
+    emptyItems_.push_back(view.naviItem_);
+    if (!emptyItemsJob_)
+        emptyItemsJob_ = ecore_job_add([](void* self) { static_cast<WNaviframe*>(self)->deleteEmptyItems(); }, this);
+}
+
+void WNaviframe::deleteEmptyItems() {
+    emptyItemsJob_ = nullptr;
+    while (naviframe_ && !emptyItems_.empty()) {
+        Elm_Object_Item* item = emptyItems_.back();
+        emptyItems_.pop_back();
+        elm_object_item_del(item);
+    }
+    announceTop();
+}
+
+void WNaviframe::announceTop() {
+    WView* top = getTopView();
+    if (!top || top == announced_)
+        return;
+    announced_ = top;
+    guarded("a view's onBecomeTop", [top] { top->onBecomeTop(); });
+}
+
+void WNaviframe::back() {
+    const Elm_Object_Item* top = naviframe_ ? elm_naviframe_top_item_get(naviframe_) : nullptr;
+    if (!top)
+        return;
+    popAsked_ = false;
+    elm_naviframe_item_pop(naviframe_);
+    // EFL pops nothing, and says nothing, while an item is still moving in.
+    backWaits_ = !popAsked_ && naviframe_ && elm_naviframe_top_item_get(naviframe_) == top;
+}
+
+WView* WNaviframe::viewOf(const Elm_Object_Item* item) const {
+    const auto found =
+        std::find_if(views_.begin(), views_.end(), [item](const WView* v) { return v->naviItem_ == item; });
+    return found == views_.end() ? nullptr : *found;
+}
+
+WView* WNaviframe::getTopView() const {
+    const Elm_Object_Item* item = naviframe_ ? elm_naviframe_top_item_get(naviframe_) : nullptr;
+    return item ? viewOf(item) : nullptr;
+}
+
+}  // namespace app_assist

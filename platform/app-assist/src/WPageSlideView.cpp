@@ -1,0 +1,130 @@
+#include "app-assist/WPageSlideView.h"
+
+#include "BounceGuard.h"
+#include "DragGuard.h"
+#include "Guarded.h"
+#include "app-assist/WUiTimer.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace app_assist {
+
+WPageSlideView::WPageSlideView() = default;
+
+WPageSlideView::~WPageSlideView() {
+    for (WView* page : pages_)
+        page->book_ = nullptr;
+}
+
+Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
+    scroller_ = elm_scroller_add(parent);
+    if (!scroller_)
+        return nullptr;
+    evas_object_size_hint_weight_set(scroller_, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+    evas_object_size_hint_align_set(scroller_, EVAS_HINT_FILL, EVAS_HINT_FILL);
+    BounceGuard::attach(scroller_);
+    DragGuard::attach(scroller_);
+    evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
+    onInitScroller(scroller_);
+    row_ = onCreateLayout(scroller_);
+    elm_object_content_set(scroller_, row_);
+    return scroller_;
+}
+
+Evas_Object* WPageSlideView::onCreateLayout(Evas_Object* parent) {
+    Evas_Object* row = elm_box_add(parent);
+    elm_box_horizontal_set(row, EINA_TRUE);
+    elm_box_layout_set(row, layPagesOut, this, nullptr);
+    evas_object_show(row);
+    return row;
+}
+
+void WPageSlideView::onInitScroller(Evas_Object* scroller) {
+    const auto bar = showScroll_ ? ELM_SCROLLER_POLICY_AUTO : ELM_SCROLLER_POLICY_OFF;
+    elm_scroller_policy_set(scroller, bar, ELM_SCROLLER_POLICY_OFF);
+    elm_scroller_bounce_set(scroller, EINA_TRUE, EINA_FALSE);
+    elm_scroller_page_relative_set(scroller, 1.0, 0.0);
+    // However hard the swipe, the next page is the one that comes.
+    elm_scroller_page_scroll_limit_set(scroller, 1, 0);
+}
+
+// By hand: widgets overwrite a size that they were told to have at least, so no box would make them a page wide.
+void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* data) {
+    const auto* view = static_cast<WPageSlideView*>(data);
+    int x = 0, y = 0, width = 0, height = 0;
+    evas_object_geometry_get(box, &x, &y, nullptr, nullptr);
+    elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, &height);
+    int count = 0;
+    const Eina_List* node = nullptr;
+    void* each = nullptr;
+    EINA_LIST_FOREACH(children->children, node, each) {
+        Evas_Object* page = static_cast<Evas_Object_Box_Option*>(each)->obj;
+        evas_object_move(page, x + width * count++, y);
+        evas_object_resize(page, width, height);
+    }
+    evas_object_size_hint_min_set(box, width * count, height);
+}
+
+void WPageSlideView::appendPage(WView* page) {
+    if (!page)
+        return;
+    page->window_ = getWindow();
+    page->book_ = this;
+    pages_.push_back(page);
+    const std::weak_ptr<void> life = page->life();
+    if (putInRow(*page) || life.expired())
+        return;
+    dlog_print(DLOG_ERROR, logTag, "the page %s could not be made", page->getClassName());
+    delete page;
+}
+
+bool WPageSlideView::putInRow(WView& page) {
+    const std::weak_ptr<void> life = page.life();
+    if (!row_ || !page.create(row_, nullptr) || life.expired())
+        return false;
+    page.giveAway();
+    elm_box_pack_end(row_, page.getEvasObj());
+    evas_object_show(page.getEvasObj());
+    page.onSetAsPageContent();
+    if (!life.expired())
+        page.onPushed(page.getNaviItem());
+    return true;
+}
+
+void WPageSlideView::pageGone(const WView& page) {
+    std::erase(pages_, &page);
+}
+
+void WPageSlideView::showPage(int index, bool relayout) {
+    if (!scroller_ || index < 0 || index >= getPageCount())
+        return;
+    if (relayout)
+        elm_box_recalculate(row_);
+    show(index);
+}
+
+void WPageSlideView::show(int index) {
+    // Before its contents are laid out, a scroller shows another page than it was told.
+    evas_smart_objects_calculate(evas_object_evas_get(scroller_));
+    int width = 0;
+    elm_scroller_region_get(scroller_, nullptr, nullptr, &width, nullptr);
+    waitingPage_ = width > 0 ? -1 : index;
+    if (width > 0)
+        elm_scroller_page_show(scroller_, index, 0);
+}
+
+void WPageSlideView::scrollerResized(void* data, Evas*, Evas_Object*, void*) {
+    auto* view = static_cast<WPageSlideView*>(data);
+    elm_box_recalculate(view->row_);
+    if (view->waitingPage_ < 0)
+        return;
+    const auto showWaiting = [view](WView*) {
+        if (view->waitingPage_ >= 0)
+            view->showPage(std::exchange(view->waitingPage_, -1), true);
+        return false;
+    };
+    WUiTimer::addJob(showWaiting, view, view->scroller_);
+}
+
+}  // namespace app_assist
