@@ -10,7 +10,7 @@ extern "C" {
 typedef struct uxt_color_table* uxt_color_table_h;
 typedef struct uxt_font_table* uxt_font_table_h;
 
-/** Which colours of a table apply. */
+/** Which colours apply, of the tables and of the device's own widget styles. */
 typedef enum {
     UXT_THEME_STYLE_LIGHT = 0,
     UXT_THEME_STYLE_DARK = 1,
@@ -25,17 +25,28 @@ typedef enum {
 uxt_color_table_h uxt_theme_add_color_table(const char* path);
 /** Reads a font table: an XML file that gives each text class its font and size. Otherwise as above. */
 uxt_font_table_h uxt_theme_add_font_table(const char* path);
-/** Frees a table; where it is in use its classes go back to what the theme files say. */
+/**
+ * Frees a table; where it is in use its classes go back to what the device's theme and the theme files say. NULL does
+ * nothing.
+ */
 void uxt_theme_delete_color_table(uxt_color_table_h table);
 void uxt_theme_delete_font_table(uxt_font_table_h table);
 
-/** Application-wide: whether tables apply, which style, which tables. Live objects change at once. */
+/**
+ * Application-wide: whether tables apply (at first they do not), which style (at first the device's), which tables
+ * (NULL: none). Live objects change at once, later ones from their start. A table or a style that does not exist is an
+ * error line in the log and changes nothing.
+ */
 void uxt_theme_set_changeable_ui_enabled(Eina_Bool enabled);
 void uxt_theme_set_style(int style);
 void uxt_theme_set_color_table(uxt_color_table_h table);
 void uxt_theme_set_font_table(uxt_font_table_h table);
 
-/** The same for one object and the layouts inside it; wins over what is set application-wide. */
+/**
+ * The same for one object and the layouts inside it, also those that come later; it wins over what is set
+ * application-wide. What is not set for the object (its style, a table) is as set application-wide; what is set for
+ * an object inside it is that one's alone. It ends with the object.
+ */
 void uxt_theme_object_set_changeable_ui_enabled(Evas_Object* obj, Eina_Bool enabled);
 void uxt_theme_object_set_style(Evas_Object* obj, int style);
 void uxt_theme_object_set_color_table(Evas_Object* obj, uxt_color_table_h table);
@@ -51,10 +62,17 @@ void uxt_theme_add_changed_callback(Evas_Object* obj, uxt_theme_changed_cb callb
 /** Removes the oldest registration of this callback for this object. */
 void uxt_theme_delete_changed_callback(Evas_Object* obj, uxt_theme_changed_cb callback);
 
-/** Adds a button in a style of the device's theme. @return NULL when it cannot be made */
+/**
+ * Adds a button in a style of the device's theme. A style that the theme lacks is a warning in the log; the button then
+ * has the default one.
+ * @return a widget that `parent` owns; NULL when it cannot be made
+ */
 Evas_Object* uxt_button_add(Evas_Object* parent, const char* style);
 
-/** Whether the scroller may scroll by itself to bring a focused child into view. On by default. */
+/**
+ * Whether a scrolling widget may scroll by itself to bring a child into view that gets the focus. On by default. It
+ * leaves fingers and calls that scroll alone.
+ */
 void uxt_scroller_set_auto_scroll_enabled(Evas_Object* scroller, Eina_Bool enabled);
 
 #ifdef __cplusplus
