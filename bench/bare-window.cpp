@@ -5,17 +5,15 @@
 #include <Elementary.h>
 
 #include <cstring>
-#include <string>
 
 namespace {
 
 constexpr int width = 720;
 constexpr int height = 1280;
-constexpr long rows = 12;
+constexpr int rows = 12;
 
-char* rowText(void* data, Evas_Object*, const char* part) {
-    const std::string text = "Row " + std::to_string(reinterpret_cast<long>(data));
-    return std::strcmp(part, "elm.text") == 0 ? strdup(text.c_str()) : nullptr;
+char* rowText(void*, Evas_Object*, const char* part) {
+    return std::strcmp(part, "elm.text") == 0 ? strdup("What a row has to say") : nullptr;
 }
 
 const char* picture;
@@ -52,9 +50,8 @@ int main(int argc, char** argv) {
     row.item_style = "default";
     row.func.text_get = rowText;
     row.func.content_get = rowContent;
-    for (long i = 1; i <= rows; ++i) {
-        elm_genlist_item_append(list, &row, reinterpret_cast<void*>(i), nullptr, ELM_GENLIST_ITEM_NONE, nullptr,
-                                nullptr);
+    for (int i = 0; i < rows; ++i) {
+        elm_genlist_item_append(list, &row, nullptr, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
     }
     evas_object_show(list);
     evas_object_resize(window, width, height);

@@ -25,7 +25,7 @@ void loadAll(int menus) {
 
 void FullLoad(benchmark::State& state) {
     const Catalogue catalogue(static_cast<int>(state.range(0)));
-    for (auto _ : state) {
+    for ([[maybe_unused]] auto _ : state) {
         loadAll(static_cast<int>(state.range(0)));
     }
 }
@@ -33,14 +33,14 @@ void FullLoad(benchmark::State& state) {
 void CachedLoad(benchmark::State& state) {
     const Catalogue catalogue(static_cast<int>(state.range(0)));
     loadAll(static_cast<int>(state.range(0)));
-    for (auto _ : state) {
+    for ([[maybe_unused]] auto _ : state) {
         KestContentMgr::getInstance()->loadContentsList(false);
     }
 }
 
 void BareParse(benchmark::State& state) {
     const Catalogue catalogue(static_cast<int>(state.range(0)));
-    for (auto _ : state) {
+    for ([[maybe_unused]] auto _ : state) {
         bench::parseBare(catalogue.files());
     }
 }
@@ -50,7 +50,7 @@ void BareParseAndWrites(benchmark::State& state) {
     loadAll(static_cast<int>(state.range(0)));
     const auto values = catalogue.device()->preferences().all("com.ravella.kest");
     bench::BareStore store(catalogue.device().folder() / "bare.db");
-    for (auto _ : state) {
+    for ([[maybe_unused]] auto _ : state) {
         bench::parseBare(catalogue.files());
         store.write(values);
     }

@@ -37,6 +37,7 @@ double milliseconds(const timespec& time) {
     setenv("FIRST_FRAME_FD", std::to_string(told).c_str(), 1);
     setenv("LD_PRELOAD", FIRST_FRAME, 1);
     std::vector<char*> arguments;
+    arguments.reserve(command.size() + 1);
     for (const std::string& word : command) {
         arguments.push_back(const_cast<char*>(word.c_str()));
     }
