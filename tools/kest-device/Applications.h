@@ -1,0 +1,37 @@
+#pragma once
+
+#include "Process.h"
+#include "Session.h"
+#include "device/BusCall.h"
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace tool {
+
+/// An application that runs on the device.
+struct RunningApplication {
+    std::string id;
+    Process process;
+    bool onBus = true;  ///< false: it runs without a bus, or does not answer on it
+};
+
+/// Those of the session's device, in the order of their ids.
+std::vector<RunningApplication> runningApplications(Session& session);
+
+/// Refuses a bus that already has another device: throws device::Error that names it.
+void requireOwnBus(Session& session, const device::Bus& bus);
+
+/// The application that a command about the screen means: `id`, or the only one that runs when it is empty.
+/// Throws device::Error when that one does not run, or when several do.
+RunningApplication theApplication(Session& session, const std::string& id);
+
+/// Calls one of the application's interfaces, com.ravella.device.Screen unless said otherwise.
+device::BusCall callTo(Session& session, const std::string& id, const char* interface = device::bus::screenInterface);
+
+/// Returns when the screens of all running applications have settled. Applications that do not answer are
+/// waited for no longer than their calls take.
+void settle(Session& session);
+
+}  // namespace tool

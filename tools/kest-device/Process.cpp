@@ -1,0 +1,185 @@
+#include "Process.h"
+
+#include "device/Error.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <csignal>
+#include <cstring>
+#include <fcntl.h>
+#include <fstream>
+#include <iterator>
+#include <spawn.h>
+#include <sys/wait.h>
+#include <thread>
+#include <unistd.h>
+
+namespace tool {
+
+namespace {
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+constexpr auto patience = 2s;
+
+fs::path procFolder(int id) {
+    return fs::path("/proc") / std::to_string(id);
+}
+
+/// A list of texts, each ended by a zero byte, as the kernel hands them out.
+std::vector<std::string> zeroEnded(const fs::path& file) {
+    std::ifstream stream(file, std::ios::binary);
+    std::vector<std::string> texts;
+    for (std::string text; std::getline(stream, text, '\0');) {
+        texts.push_back(text);
+    }
+    return texts;
+}
+
+std::vector<std::string> environmentWith(const std::vector<std::pair<std::string, std::string>>& changes) {
+    std::vector<std::string> all;
+    for (char** entry = environ; *entry; ++entry) {
+        const std::string text = *entry;
+        const std::string name = text.substr(0, text.find('='));
+        const bool changed =
+            std::any_of(changes.begin(), changes.end(), [&](const auto& change) { return change.first == name; });
+        if (!changed) {
+            all.push_back(text);
+        }
+    }
+    for (const auto& [name, value] : changes) {
+        all.push_back(name + "=" + value);
+    }
+    return all;
+}
+
+std::vector<char*> pointersTo(std::vector<std::string>& texts) {
+    std::vector<char*> pointers;
+    for (std::string& text : texts) {
+        pointers.push_back(text.data());
+    }
+    pointers.push_back(nullptr);
+    return pointers;
+}
+
+/// posix_spawn's settings, freed at the end.
+class SpawnSettings {
+public:
+    SpawnSettings() {
+        posix_spawn_file_actions_init(&actions);
+        posix_spawnattr_init(&attributes);
+    }
+    ~SpawnSettings() {
+        posix_spawn_file_actions_destroy(&actions);
+        posix_spawnattr_destroy(&attributes);
+    }
+    SpawnSettings(const SpawnSettings&) = delete;
+    SpawnSettings& operator=(const SpawnSettings&) = delete;
+
+    posix_spawn_file_actions_t actions{};
+    posix_spawnattr_t attributes{};
+};
+
+}  // namespace
+
+std::vector<Process> Process::withEnvironment(const std::string& variable, const std::string& value) {
+    std::vector<Process> found;
+    std::error_code error;
+    for (fs::directory_iterator entry("/proc", error), end; !error && entry != end; entry.increment(error)) {
+        const std::string name = entry->path().filename();
+        if (name.find_first_not_of("0123456789") != std::string::npos) {
+            continue;
+        }
+        const Process process(std::stoi(name));
+        if (process.id() != getpid() && process.environment(variable) == value) {
+            found.push_back(process);
+        }
+    }
+    return found;
+}
+
+bool Process::runs() const {
+    std::ifstream stream(procFolder(id_) / "stat");
+    std::string stat{std::istreambuf_iterator<char>(stream), {}};
+    // The state follows the name, which stands in parentheses and may hold any character.
+    const std::size_t name = stat.rfind(") ");
+    return name != std::string::npos && stat[name + 2] != 'Z' && stat[name + 2] != 'X';
+}
+
+fs::path Process::executable() const {
+    std::error_code error;
+    return fs::read_symlink(procFolder(id_) / "exe", error);
+}
+
+std::vector<std::string> Process::arguments() const {
+    return zeroEnded(procFolder(id_) / "cmdline");
+}
+
+std::optional<std::string> Process::environment(const std::string& variable) const {
+    for (const std::string& entry : zeroEnded(procFolder(id_) / "environ")) {
+        if (entry.starts_with(variable + "=")) {
+            return entry.substr(variable.size() + 1);
+        }
+    }
+    return std::nullopt;
+}
+
+bool Process::endsWithin(std::chrono::milliseconds time) const {
+    const auto deadline = std::chrono::steady_clock::now() + time;
+    while (runs()) {
+        if (std::chrono::steady_clock::now() >= deadline) {
+            return false;
+        }
+        std::this_thread::sleep_for(5ms);
+    }
+    return true;
+}
+
+void Process::end() const {
+    kill(id_, SIGTERM);
+    if (endsWithin(patience)) {
+        return;
+    }
+    kill(id_, SIGKILL);
+    if (!endsWithin(patience)) {
+        throw device::Error("process " + std::to_string(id_) + " does not end; end it by hand");
+    }
+}
+
+Process startDetached(const Program& program) {
+    SpawnSettings settings;
+    posix_spawnattr_setflags(&settings.attributes, POSIX_SPAWN_SETSID);
+    posix_spawn_file_actions_addopen(&settings.actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
+    posix_spawn_file_actions_addopen(&settings.actions, STDOUT_FILENO, program.output.c_str(),
+                                     O_WRONLY | O_CREAT | O_TRUNC, 0600);
+    posix_spawn_file_actions_adddup2(&settings.actions, STDOUT_FILENO, STDERR_FILENO);
+    if (program.inherited >= 0) {
+        // Onto itself: that takes its close-on-exec mark away, in the child only.
+        posix_spawn_file_actions_adddup2(&settings.actions, program.inherited, program.inherited);
+    }
+    posix_spawn_file_actions_addchdir_np(&settings.actions, "/");
+
+    std::vector<std::string> words = program.words;
+    std::vector<std::string> environment = environmentWith(program.environment);
+    pid_t id = 0;
+    const int error = posix_spawn(&id, words.front().c_str(), &settings.actions, &settings.attributes,
+                                  pointersTo(words).data(), pointersTo(environment).data());
+    if (error != 0) {
+        throw device::Error("cannot start " + words.front() + ": " + std::strerror(error));
+    }
+    return Process(id);
+}
+
+std::optional<std::string> endOfChild(const Process& child) {
+    int status = 0;
+    if (waitpid(child.id(), &status, WNOHANG) != child.id()) {
+        return std::nullopt;
+    }
+    if (WIFSIGNALED(status)) {
+        return "by signal " + std::to_string(WTERMSIG(status)) + " (" + strsignal(WTERMSIG(status)) + ")";
+    }
+    return "with status " + std::to_string(WEXITSTATUS(status));
+}
+
+}  // namespace tool

@@ -1,0 +1,53 @@
+#pragma once
+
+#include <chrono>
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace tool {
+
+/// A process of this machine, by its id.
+class Process {
+public:
+    explicit Process(int id) : id_(id) {}
+
+    /// All processes of this user that have `variable` set to `value` in the environment that they were started with.
+    static std::vector<Process> withEnvironment(const std::string& variable, const std::string& value);
+
+    int id() const { return id_; }
+    /// False as soon as it has ended, also while its parent has not noticed yet.
+    bool runs() const;
+    /// Its executable; empty when it cannot be told.
+    std::filesystem::path executable() const;
+    /// Its words, the program's name first; empty when they cannot be told.
+    std::vector<std::string> arguments() const;
+    /// A variable of the environment that it was started with.
+    std::optional<std::string> environment(const std::string& variable) const;
+
+    /// Whether it ended within that time.
+    bool endsWithin(std::chrono::milliseconds time) const;
+    /// Asks it to end, and after a while makes it end. Throws device::Error when it goes on nevertheless.
+    void end() const;
+
+private:
+    int id_;
+};
+
+/// What to start, and how it stands towards its surroundings. Nothing of it passes through a shell.
+struct Program {
+    std::vector<std::string> words;  ///< absolute path of the executable, then its arguments
+    std::filesystem::path output;    ///< file that takes its standard output and error; /dev/null to drop them
+    std::vector<std::pair<std::string, std::string>> environment;  ///< set beside what this process has
+    int inherited = -1;  ///< a file that it gets under the same number; -1 for none
+};
+
+/// Starts a program in a session of its own, in the folder "/", with no standard input.
+/// Throws device::Error that names the program when it cannot be started.
+Process startDetached(const Program& program);
+
+/// How a child of this process ended ("with status 1", "by signal 11 (Segmentation fault)"), or nullopt while it runs.
+std::optional<std::string> endOfChild(const Process& child);
+
+}  // namespace tool

@@ -1,0 +1,45 @@
+#include "Session.h"
+
+namespace tool {
+
+const device::Folder& Session::folder() {
+    if (!folder_) {
+        folder_ = std::make_unique<device::Folder>(device::Folder::resolve());
+    }
+    return *folder_;
+}
+
+device::Device& Session::device() {
+    if (!device_) {
+        device::Device::Options options = device::Device::Options::standard();
+        options.check = device::Database::Check::Full;
+        device_ = std::make_unique<device::Device>(std::move(options));
+    }
+    return *device_;
+}
+
+device::Bus* Session::bus() {
+    return busSought_ ? bus_.get() : reconnect();
+}
+
+device::Bus* Session::reconnect() {
+    bus_ = device::Bus::connect(folder());
+    busSought_ = true;
+    return bus_.get();
+}
+
+device::Device& Session::connectedDevice() {
+    device::Device& opened = device();
+    if (device::Bus* there = bus()) {
+        opened.events().connect(*there);
+    }
+    return opened;
+}
+
+void Session::close() {
+    device_.reset();
+    bus_.reset();
+    busSought_ = false;
+}
+
+}  // namespace tool

@@ -1,0 +1,103 @@
+#include "Applications.h"
+#include "Commands.h"
+#include "device/Error.h"
+
+#include <iostream>
+
+namespace tool {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr char tapAbout[] = R"(Touches a place, or the one text in sight that equals TEXT or, where none does, holds it.
+Returns when the screen has settled.
+
+Examples:
+  kest-device tap 360 400
+  kest-device tap --text "Wi-Fi")";
+
+constexpr char swipeAbout[] = R"(Moves a finger from one place to another. Returns when the screen has settled.
+
+Examples:
+  kest-device swipe 360 1000 360 300              scroll a list
+  kest-device swipe 600 640 100 640 --seconds 0.5)";
+
+constexpr char keyAbout[] =
+    R"(NAME is back, Escape, Return, Up, Down, Left, Right, Tab, space, BackSpace, Delete, Home, End, Prior, Next,
+KP_Enter, XF86Back, a letter or a digit. Returns when the screen has settled.
+
+Example:
+  kest-device key Escape)";
+
+struct Options {
+    std::vector<int> places;
+    std::string text;
+    double seconds = 0.15;
+    std::string key;
+    std::string appId;
+};
+
+/// Input that ends the application was carried out all the same.
+void send(Session& session, const std::string& appId, const std::string& method,
+          const device::BusCall::Arguments& arguments) {
+    const RunningApplication application = theApplication(session, appId);
+    try {
+        callTo(session, application.id).call(method, arguments);
+    } catch (const device::Error&) {
+        if (!application.process.endsWithin(1s)) {
+            throw;
+        }
+        std::cout << application.id << " ended\n";
+    }
+}
+
+void tap(Session& session, const Options& options, bool byText) {
+    if (byText == !options.places.empty()) {
+        throw UsageError("tap needs either X and Y or --text");
+    }
+    if (byText) {
+        send(session, options.appId, "TapText", {options.text});
+    } else {
+        send(session, options.appId, "Tap", {options.places[0], options.places[1]});
+    }
+}
+
+}  // namespace
+
+void addTap(CLI::App& app, Session& session) {
+    CLI::App* command = app.add_subcommand("tap", "Touch the screen");
+    const auto options = std::make_shared<Options>();
+    command->add_option("place", options->places, "The place, in pixels")->type_name("X Y")->expected(2);
+    const CLI::Option* text = command->add_option("--text", options->text, "A text in sight")->type_name("TEXT");
+    addAppOption(*command, options->appId);
+    command->footer(tapAbout);
+    command->callback([options, text, &session] { tap(session, *options, text->count() > 0); });
+}
+
+void addSwipe(CLI::App& app, Session& session) {
+    CLI::App* command = app.add_subcommand("swipe", "Move a finger over the screen");
+    const auto options = std::make_shared<Options>();
+    command->add_option("places", options->places, "From and to, in pixels")
+        ->type_name("X1 Y1 X2 Y2")
+        ->expected(4)
+        ->required();
+    command->add_option("--seconds", options->seconds, "How long it takes")->type_name("S")->capture_default_str();
+    addAppOption(*command, options->appId);
+    command->footer(swipeAbout);
+    command->callback([options, &session] {
+        const std::vector<int>& at = options->places;
+        send(session, options->appId, "Swipe", {at[0], at[1], at[2], at[3], options->seconds});
+    });
+}
+
+void addKey(CLI::App& app, Session& session) {
+    CLI::App* command = app.add_subcommand("key", "Press and release a key");
+    const auto options = std::make_shared<Options>();
+    command->add_option("name", options->key, "The key")->type_name("NAME")->required();
+    addAppOption(*command, options->appId);
+    command->footer(keyAbout);
+    command->callback([options, &session] { send(session, options->appId, "Key", {options->key}); });
+}
+
+}  // namespace tool

@@ -1,0 +1,104 @@
+#include "Output.h"
+#include "Session.h"
+#include "commands/Commands.h"
+#include "device/Error.h"
+
+#include <iostream>
+#include <string>
+
+namespace {
+
+constexpr int failed = 1;
+constexpr int wrongUsage = 2;
+
+constexpr char about[] =
+    "Runs and controls a device on this workstation: its applications, settings, packages, log and\n"
+    "screen. A device is a folder: $KEST_DEVICE, else kest-device in the user's state folder.";
+
+constexpr char examples[] = R"(Examples:
+  kest-device start --headless            start Tips without a display
+  kest-device set language ko_KR          change the display language
+  kest-device tap --text "Wi-Fi"          touch a text on the screen
+  kest-device screenshot list.png         save what the screen shows
+  kest-device stop                        end everything that runs on the device
+
+Exit status: 0 when it was done, 1 when it could not be done, 2 when the command line is wrong.)";
+
+int sayError(const std::string& message, int status) {
+    std::string line = message;
+    for (char& character : line) {
+        if (character == '\n' || character == '\r') {
+            character = ' ';
+        }
+    }
+    while (line.ends_with(' ')) {
+        line.pop_back();
+    }
+    std::cerr << "kest-device: error: " << line << '\n';
+    return status;
+}
+
+void describe(CLI::App& app, tool::Session& session) {
+    app.name("kest-device");
+    app.set_version_flag("--version", "kest-device " PROJECT_VERSION, "Print the version and end");
+    app.set_help_flag("-h,--help", "Print this help and end");
+    app.footer(examples);
+    app.require_subcommand(1);
+    for (const auto add :
+         {tool::addStart, tool::addStop,        tool::addStatus,  tool::addReset,     tool::addGet,
+          tool::addSet,   tool::addUnset,       tool::addInstall, tool::addUninstall, tool::addPackages,
+          tool::addClear, tool::addPreferences, tool::addUsage,   tool::addLog,       tool::addTree,
+          tool::addTap,   tool::addSwipe,       tool::addKey,     tool::addWaitFor,   tool::addScreenshot}) {
+        add(app, session);
+    }
+}
+
+/// The bus carries no other text, and a command line can hold anything.
+bool isUtf8(const char* text) {
+    try {
+        tool::Json(text).dump();
+        return true;
+    } catch (const tool::Json::type_error&) {
+        return false;
+    }
+}
+
+/// The command whose help explains the mistake.
+std::string helpCommand(const CLI::App& app) {
+    const auto commands = app.get_subcommands();
+    return "kest-device " + (commands.empty() ? "" : commands.front()->get_name() + " ") + "--help";
+}
+
+int run(int argc, char** argv) {
+    for (int i = 1; i < argc; ++i) {
+        if (!isUtf8(argv[i])) {
+            return sayError("argument " + std::to_string(i) + " is not UTF-8", wrongUsage);
+        }
+    }
+    tool::Session session;
+    CLI::App app(about);
+    describe(app, session);
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::Success& request) {
+        return app.exit(request);
+    } catch (const CLI::ParseError& error) {
+        return sayError(std::string(error.what()) + "; see '" + helpCommand(app) + "'", wrongUsage);
+    } catch (const tool::UsageError& error) {
+        return sayError(std::string(error.what()) + "; see '" + helpCommand(app) + "'", wrongUsage);
+    }
+    if (!std::cout.flush()) {
+        return sayError("cannot write the output; is the disk full?", failed);
+    }
+    return 0;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return run(argc, argv);
+    } catch (const std::exception& error) {
+        return sayError(error.what(), failed);
+    }
+}
