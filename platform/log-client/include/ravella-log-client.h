@@ -23,13 +23,14 @@ int ravella_log_manager_create(ravella_log_manager_h* handle);
  * Stores a record; it is on the device when this returns 0.
  * @param uri a content URI; its scheme must be "content://"
  * @param record its strings are copied
- * @param callback may be NULL
+ * @param callback may be NULL; not called when the handle is destroyed before the main loop comes to it
  * @param[out] request_id may be NULL
  * @return 0; TIZEN_ERROR_INVALID_PARAMETER; TIZEN_ERROR_IO_ERROR
  */
 int ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
                                ravella_log_insert_cb callback, void* user_data, int* request_id);
 
+/** Frees the handle; allowed from inside a callback. @return 0; TIZEN_ERROR_INVALID_PARAMETER for NULL */
 int ravella_log_manager_destroy(ravella_log_manager_h handle);
 
 #ifdef __cplusplus

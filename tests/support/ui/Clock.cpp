@@ -12,6 +12,7 @@ constexpr double frame = 1.0 / 60;
 constexpr double instant = 1e-7;
 
 bool started = false;
+bool ended = false;
 double now = 1000.0;
 
 bool ticking = false;
@@ -68,6 +69,7 @@ namespace test_ui::clock {
 
 void start() {
     started = true;
+    ended = false;
 }
 
 void driveMainLoop() {
@@ -95,7 +97,7 @@ unsigned int timestamp() {
 
 namespace test_ui {
 
-void runFor(double seconds) {
+bool runFor(double seconds) {
     clock::driveAnimations();
     bool over = false;
     Ecore_Timer* timer = ecore_timer_add(
@@ -109,6 +111,18 @@ void runFor(double seconds) {
     ecore_main_loop_begin();
     if (!over)
         ecore_timer_del(timer);
+    ended = ended || !over;
+    return over;
+}
+
+void inMainLoop(const std::function<void()>& function) {
+    const auto call = [](void* data) { (*static_cast<const std::function<void()>*>(data))(); };
+    ecore_job_add(call, const_cast<std::function<void()>*>(&function));
+    runFor(0.0);
+}
+
+bool hasEnded() {
+    return ended;
 }
 
 bool runUntil(const std::function<bool()>& condition, double seconds) {

@@ -22,8 +22,12 @@ unsigned int timestamp();
 
 namespace test_ui {
 
-/// Lets the main loop run for `seconds` of the test's clock, or until the application ends it.
-void runFor(double seconds);
+/// Lets the main loop run for `seconds` of the test's clock. False when somebody ended the main loop before.
+bool runFor(double seconds);
+/// Calls `function` from inside the main loop, as what a user does comes from there.
+void inMainLoop(const std::function<void()>& function);
+/// Whether somebody ended the main loop since EFL started: the application is over.
+bool hasEnded();
 /// Lets the main loop run until `condition` holds; false when it still does not after `seconds`.
 bool runUntil(const std::function<bool()>& condition, double seconds = 5.0);
 

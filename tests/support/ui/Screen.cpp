@@ -13,17 +13,19 @@ Rect geometry(const Evas_Object* object) {
 }
 
 void Screen::press(Point at) {
-    evas_event_feed_mouse_in(canvas(), clock::timestamp(), nullptr);
-    moveTo(at);
-    evas_event_feed_mouse_down(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr);
+    inMainLoop([&] {
+        evas_event_feed_mouse_in(canvas(), clock::timestamp(), nullptr);
+        evas_event_feed_mouse_move(canvas(), at.x, at.y, clock::timestamp(), nullptr);
+        evas_event_feed_mouse_down(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr);
+    });
 }
 
 void Screen::moveTo(Point to) {
-    evas_event_feed_mouse_move(canvas(), to.x, to.y, clock::timestamp(), nullptr);
+    inMainLoop([&] { evas_event_feed_mouse_move(canvas(), to.x, to.y, clock::timestamp(), nullptr); });
 }
 
 void Screen::lift() {
-    evas_event_feed_mouse_up(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr);
+    inMainLoop([&] { evas_event_feed_mouse_up(canvas(), 1, EVAS_BUTTON_NONE, clock::timestamp(), nullptr); });
 }
 
 void Screen::tap(Point at, double hold) {
@@ -47,8 +49,16 @@ void Screen::swipe(Point from, Point to, double seconds) {
 void Screen::key(const std::string& name) {
     if (!focused_)
         takeFocus();
-    evas_event_feed_key_down(canvas(), name.c_str(), name.c_str(), nullptr, nullptr, clock::timestamp(), nullptr);
-    evas_event_feed_key_up(canvas(), name.c_str(), name.c_str(), nullptr, nullptr, clock::timestamp(), nullptr);
+    inMainLoop([&] {
+        const char* key = name.c_str();
+        evas_event_feed_key_down(canvas(), key, key, nullptr, nullptr, clock::timestamp(), nullptr);
+    });
+    // The window may be gone by now.
+    if (!hasEnded())
+        inMainLoop([&] {
+            const char* key = name.c_str();
+            evas_event_feed_key_up(canvas(), key, key, nullptr, nullptr, clock::timestamp(), nullptr);
+        });
     runFor(0.01);
 }
 

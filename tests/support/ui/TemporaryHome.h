@@ -1,5 +1,7 @@
 #pragma once
 
+#include "support/TemporaryFolder.h"
+
 #include <filesystem>
 
 namespace test_ui {
@@ -9,14 +11,11 @@ namespace test_ui {
 class TemporaryHome {
 public:
     TemporaryHome();
-    ~TemporaryHome();
-    TemporaryHome(const TemporaryHome&) = delete;
-    TemporaryHome& operator=(const TemporaryHome&) = delete;
 
-    const std::filesystem::path& path() const { return path_; }
+    const std::filesystem::path& path() const { return folder_.path(); }
 
 private:
-    std::filesystem::path path_;
+    support::TemporaryFolder folder_;
 };
 
 }  // namespace test_ui

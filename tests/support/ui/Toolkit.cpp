@@ -32,8 +32,8 @@ Toolkit::Toolkit() {
     setenv("EINA_LOG_BACKTRACE", "-1", 1);
     // Otherwise frames are drawn by a thread in its own time.
     setenv("ECORE_EVAS_FORCE_SYNC_RENDER", "1", 1);
-    for (const char* display : {"DISPLAY", "WAYLAND_DISPLAY", "LANGUAGE", "LC_ALL"})
-        unsetenv(display);
+    for (const char* outer : {"DISPLAY", "WAYLAND_DISPLAY", "DBUS_SESSION_BUS_ADDRESS", "LANGUAGE", "LC_ALL"})
+        unsetenv(outer);
     setenv("LANG", "C.UTF-8", 1);
 
     clock::start();

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "device/Folder.h"
+
 #include <Eldbus.h>
 
 #include <functional>
@@ -8,12 +10,12 @@
 
 namespace device {
 
-class Folder;
+class BlockingConnection;
 
 /// Names on the bus that every process of a device knows.
 namespace bus {
-inline constexpr char deviceName[] =
-    "com.ravella.device";  ///< owned by the device's first process, queued for by the others
+/// Owned by the device's first process, queued for by the others.
+inline constexpr char deviceName[] = "com.ravella.device";
 inline constexpr char eventsPath[] = "/com/ravella/device";  ///< signals of Events come from here
 inline constexpr char eventsInterface[] = "com.ravella.device.Events";
 inline constexpr char applicationInterface[] = "com.ravella.device.Application";
@@ -25,24 +27,39 @@ std::string pathOf(const std::string& appId);
 /// This process's connection to the device's bus: the session bus where there is one, else the private bus that
 /// the device's folder names. Owns the connection; ends it when destroyed.
 class Bus {
+    struct Link;
+
 public:
-    /// Null when there is no bus at all, or none that answers (never an abort, never a hang).
+    /// Null when there is no bus on a local socket, or none that answers within 2 s (never an abort, never a hang,
+    /// nothing on standard error).
     static std::unique_ptr<Bus> connect(const Folder& folder);
+    explicit Bus(std::unique_ptr<Link> link);  ///< for connect() only
     ~Bus();
     Bus(const Bus&) = delete;
     Bus& operator=(const Bus&) = delete;
 
-    Eldbus_Connection* connection() const { return connection_; }
-    const Folder& folder() const { return folder_; }
+    /// For what is served and sent; its answers come through the main loop.
+    Eldbus_Connection* connection() const;
+    const Folder& folder() const;
 
-    /// Called when the bus goes away while the process runs.
+    /// False once the bus has gone. Nothing that waits for an answer may be sent on connection() then: libdbus
+    /// ends a process that does.
+    bool isAlive() const;
+
+    /// Called from the main loop when the bus goes away while the process runs; may destroy this object.
     void onLost(std::function<void()> handler);
 
+    /// A second connection, for calls that wait for their answer without a main loop; opened at the first call.
+    /// All that was sent on connection() before has reached the bus when this returns. For BusName and BusCall.
+    /// Throws Error when the bus does not answer.
+    BlockingConnection& blocking() const;
+
+    /// Has the bus take a name for connection(), or give it back. For BusName.
+    unsigned requestName(const std::string& name, unsigned flags) const;
+    void releaseName(const std::string& name) const;
+
 private:
-    Bus(Eldbus_Connection* connection, const Folder& folder);
-    Eldbus_Connection* connection_;
-    const Folder& folder_;
-    std::function<void()> lost_;
+    std::unique_ptr<Link> link_;
 };
 
 }  // namespace device

@@ -2,7 +2,11 @@
 
 #include <SQLiteCpp/SQLiteCpp.h>
 
+#include <filesystem>
+#include <map>
 #include <memory>
+#include <string>
+#include <utility>
 
 namespace device {
 
@@ -22,9 +26,48 @@ public:
     Database(const Folder& folder, Check check);
 
     SQLite::Database& sql() { return *sql_; }
+    const std::filesystem::path& file() const { return file_; }
+
+    /// One use of a prepared statement that the database keeps; the statement is free for the next use when this ends.
+    class Query {
+    public:
+        explicit Query(SQLite::Statement& statement) : statement_(statement) {}
+        ~Query();
+        Query(const Query&) = delete;
+        Query& operator=(const Query&) = delete;
+        SQLite::Statement* operator->() const { return &statement_; }
+
+    private:
+        SQLite::Statement& statement_;
+    };
+
+    /// The statement of that text, with its parameters bound in their order. Not to be used twice at the same time.
+    template <class... Parameters>
+    Query query(const char* text, const Parameters&... parameters) {
+        SQLite::Statement& prepared = statement(text);
+        [[maybe_unused]] int index = 0;
+        (prepared.bind(++index, parameters), ...);
+        return Query(prepared);
+    }
+
+    /// Runs `work` and turns a failure of the database in it into an Error for people.
+    template <class Work>
+    auto guarded(Work&& work) -> decltype(work()) {
+        try {
+            return work();
+        } catch (const SQLite::Exception& failure) {
+            fail(failure);
+        }
+    }
 
 private:
+    SQLite::Statement& statement(const char* text);
+    [[noreturn]] void fail(const SQLite::Exception& failure);
+
+    std::filesystem::path file_;
+    std::filesystem::path suspicion_;
     std::unique_ptr<SQLite::Database> sql_;
+    std::map<std::string, SQLite::Statement, std::less<>> statements_;
 };
 
 }  // namespace device

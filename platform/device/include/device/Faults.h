@@ -9,7 +9,8 @@
 namespace device::faults {
 
 /// Lets calls of `service` (the public function's name, for example "preference_set_string") fail: the first
-/// `skip` calls go through, then `count` calls fail with `error`. A second plan for the same name replaces the first.
+/// `skip` calls go through, then `count` calls fail with `error`. A second plan for the same name replaces the first;
+/// a count of 0 forgets it.
 void plan(std::string_view service, int error, int count = 1, int skip = 0);
 /// Forgets all plans.
 void clear();

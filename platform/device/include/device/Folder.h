@@ -13,16 +13,21 @@ public:
     /// Throws Error when none of the three is set, and as the constructor does.
     static Folder resolve();
 
-    /// Throws Error when the path holds a blank or a control character: the applications' markup refers to
-    /// files as `href=file:PATH`, which cannot carry one.
+    /// Makes the path absolute and follows the links in it, so that one folder has one name in all processes.
+    /// Throws Error when it holds a blank, a control character, one of <>&"' or bytes that are not UTF-8: the
+    /// applications' markup refers to files as `href=file:PATH`, which cannot carry them.
     explicit Folder(std::filesystem::path root);
 
     /// Makes the folder (mode 0700) with its parents, if it is not there.
-    /// Throws Error when it cannot be made or written.
+    /// Throws Error when it cannot be made or written, or when something else stands in its place.
     void create() const;
 
     const std::filesystem::path& root() const { return root_; }
     std::filesystem::path database() const { return root_ / "device.db"; }
+    /// Held while the database is opened, made or set aside.
+    std::filesystem::path databaseLock() const { return root_ / "device.db.lock"; }
+    /// There while the database waits for a full check, because a page of it was found damaged in use.
+    std::filesystem::path databaseSuspicion() const { return root_ / "device.db.suspect"; }
     std::filesystem::path log() const { return root_ / "device.log"; }
     /// Packages installed on this device only, laid out as under the device's own /opt/usr/apps.
     std::filesystem::path apps() const { return root_ / "opt/usr/apps"; }

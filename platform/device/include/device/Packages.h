@@ -10,6 +10,7 @@ namespace device {
 class Database;
 class Events;
 class Folder;
+struct PackageEvent;
 
 /// What a package's tizen-manifest.xml says of it, and where it lies.
 struct Package {
@@ -44,13 +45,21 @@ public:
     /// Copies the package in `source` onto the device and returns it. An installed package of the same id is
     /// replaced (an update). Publishes started, processing and completed or failed; the copy is in place before
     /// "completed", and nothing has changed after "failed".
-    /// Throws Error when the manifest is broken or the copy fails.
+    /// Throws Error when the manifest is broken (before anything is published), when the package holds something
+    /// else than files and folders, when it and the device's folder lie in each other, or when the copy fails.
     Package install(const std::filesystem::path& source);
     /// Removes the package from the device, also one that the build ships (which stays where it lies).
     /// Publishes as install() does. Throws Error when it is not installed.
     void uninstall(const std::string& id);
 
 private:
+    Package read(const std::string& id, const std::filesystem::path& root) const;
+    void place(const std::filesystem::path& from, const std::string& id, PackageEvent event);
+    void commit(const std::filesystem::path& fresh, const std::string& id);
+    void remove(const std::string& id, PackageEvent event);
+    void publishCompletion(PackageEvent event);
+    void publishFailure(PackageEvent event);
+
     Database& database_;
     Events& events_;
     const Folder& folder_;

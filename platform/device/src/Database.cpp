@@ -1,0 +1,106 @@
+#include "device/Database.h"
+
+#include "DatabaseFailure.h"
+#include "DatabaseHealth.h"
+#include "Files.h"
+#include "device/Error.h"
+#include "device/Folder.h"
+#include "device/Keys.h"
+
+#include <fcntl.h>
+#include <sqlite3.h>
+#include <tuple>
+
+namespace device {
+namespace {
+
+constexpr int busyTimeoutInMilliseconds = 5000;
+
+constexpr char schema[] = R"(
+CREATE TABLE setting (key TEXT PRIMARY KEY NOT NULL, value TEXT NOT NULL);
+CREATE TABLE preference (app_id TEXT NOT NULL, key TEXT NOT NULL, value TEXT NOT NULL, PRIMARY KEY (app_id, key));
+CREATE TABLE package (id TEXT PRIMARY KEY NOT NULL, state TEXT NOT NULL CHECK (state IN ('installed', 'removed')));
+CREATE TABLE usage (
+    id INTEGER PRIMARY KEY AUTOINCREMENT, time TEXT NOT NULL, uri TEXT NOT NULL, record TEXT NOT NULL);
+)";
+
+void createSchema(SQLite::Database& sql) {
+    SQLite::Transaction transaction(sql, SQLite::TransactionBehavior::IMMEDIATE);
+    sql.exec(schema);
+    SQLite::Statement setting(sql, "INSERT INTO setting (key, value) VALUES (?, ?)");
+    for (const auto& [key, value] :
+         {std::pair(keys::language, keys::defaultLanguage), std::pair(keys::theme, keys::defaultTheme),
+          std::pair(keys::screen, keys::defaultScreen)}) {
+        setting.bind(1, key);
+        setting.bind(2, value);
+        setting.exec();
+        setting.reset();
+    }
+    sql.exec("PRAGMA user_version = " + std::to_string(schemaVersion));
+    transaction.commit();
+}
+
+void useWriteAheadLog(SQLite::Database& sql, const std::filesystem::path& file) {
+    const std::string mode = sql.execAndGet("PRAGMA journal_mode = WAL").getString();
+    if (mode != "wal")
+        throw Error(file.string() + ": the file system cannot share it between processes (journal mode " + mode +
+                    "); put the device on a local disk with KEST_DEVICE");
+    sql.exec("PRAGMA synchronous = NORMAL");
+}
+
+/// SQLite would open some of these and wait, or say only that it cannot.
+void refuseWhatIsNoFile(const std::filesystem::path& file) {
+    std::error_code error;
+    const auto status = std::filesystem::status(file, error);
+    if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status))
+        throw Error(file.string() + ": is not a file; move it away, and the device begins with a fresh database");
+}
+
+}  // namespace
+
+Database::Query::~Query() {
+    std::ignore = statement_.tryReset();
+}
+
+Database::Database(const Folder& folder, Check check)
+    : file_(folder.database()), suspicion_(folder.databaseSuspicion()) {
+    const FileLock lock(folder.databaseLock());
+    refuseWhatIsNoFile(file_);
+    std::error_code ignored;
+    const bool thorough = check == Check::Full || std::filesystem::exists(suspicion_, ignored);
+    std::string damage;
+    try {
+        sql_ = std::make_unique<SQLite::Database>(file_.string(), SQLite::OPEN_READWRITE | SQLite::OPEN_CREATE,
+                                                  busyTimeoutInMilliseconds);
+        damage = damageOf(*sql_, file_, thorough);
+        if (damage.empty()) {
+            useWriteAheadLog(*sql_, file_);
+            if (isFresh(*sql_))
+                createSchema(*sql_);
+        }
+    } catch (const SQLite::Exception& failure) {
+        if (!tellsOfDamage(failure))
+            fail(failure);
+        damage = failure.what();
+    }
+    if (!damage.empty()) {
+        sql_.reset();
+        throw DamagedError(setAside(file_, damage));
+    }
+    std::filesystem::remove(suspicion_, ignored);
+}
+
+SQLite::Statement& Database::statement(const char* text) {
+    const auto found = statements_.find(text);
+    if (found != statements_.end())
+        return found->second;
+    return statements_.try_emplace(text, *sql_, text).first->second;
+}
+
+void Database::fail(const SQLite::Exception& failure) {
+    if (tellsOfDamage(failure))
+        Descriptor(open(suspicion_.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
+    throw Error(lineFor(file_, failure, sql_ ? sqlite3_system_errno(sql_->getHandle()) : 0));
+}
+
+}  // namespace device

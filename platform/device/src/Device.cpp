@@ -1,0 +1,89 @@
+#include "device/Device.h"
+
+#include "device/Error.h"
+#include "device/Faults.h"
+#include "device/Keys.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <utility>
+
+namespace device {
+namespace {
+
+std::unique_ptr<Device>& slot() {
+    static std::unique_ptr<Device> device;
+    return device;
+}
+
+std::unique_ptr<Device> openStandard() {
+    if (const char* faults = std::getenv("DEVICE_FAULTS"))
+        faults::planFromText(faults);
+    try {
+        return std::make_unique<Device>(Device::Options::standard());
+    } catch (const DamagedError& damage) {
+        std::fprintf(stderr, "%s\n", damage.what());
+    }
+    return std::make_unique<Device>(Device::Options::standard());
+}
+
+Device::Options withFolder(Device::Options options) {
+    options.folder.create();
+    return options;
+}
+
+}  // namespace
+
+Device::Options Device::Options::standard() {
+    return {Folder::resolve(), {DEVICE_PREINSTALLED_DIR}, DEVICE_DATA_DIR};
+}
+
+Device::Device(Options options)
+    : options_(withFolder(std::move(options))), database_(options_.folder, options_.check),
+      settings_(database_, events_), preferences_(database_),
+      packages_(database_, events_, options_.folder, options_.preinstalled), usage_(database_),
+      log_(options_.folder.log()) {}
+
+Device::~Device() = default;
+
+Device& Device::current() {
+    if (!slot())
+        slot() = openStandard();
+    return *slot();
+}
+
+void Device::setCurrent(std::unique_ptr<Device> device) {
+    slot() = std::move(device);
+}
+
+const Screen& Device::screen() const {
+    return Screen::named(settings_.get(keys::screen).value_or(keys::defaultScreen));
+}
+
+std::string Device::language() const {
+    const std::string language = settings_.get(keys::language).value_or(keys::defaultLanguage);
+    return language.substr(0, language.find_first_of(".@"));
+}
+
+std::vector<std::string> Device::languages() const {
+    std::vector<std::string> languages;
+    std::error_code error;
+    for (const auto& entry : std::filesystem::directory_iterator(data() / "locale", error))
+        if (std::filesystem::is_regular_file(entry.path() / "LC_MESSAGES/sys_string.mo", error))
+            languages.push_back(entry.path().filename().string());
+    std::sort(languages.begin(), languages.end());
+    return languages;
+}
+
+const Application& Device::application() {
+    if (!application_)
+        application_ = std::make_unique<Application>(Application::ofThisProcess());
+    return *application_;
+}
+
+void Device::setApplication(Application application) {
+    application_ = std::make_unique<Application>(std::move(application));
+}
+
+}  // namespace device

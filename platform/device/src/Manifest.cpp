@@ -1,0 +1,169 @@
+#include "Files.h"
+#include "device/BusName.h"
+#include "device/Error.h"
+#include "device/Packages.h"
+
+#include <cerrno>
+#include <fcntl.h>
+#include <libxml/parser.h>
+#include <memory>
+#include <string_view>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace device {
+namespace {
+
+constexpr std::size_t largestManifest = 1024 * 1024;
+
+/// Frees a libxml2 object with its own function.
+template <auto release>
+struct Release {
+    template <class Object>
+    void operator()(Object* object) const {
+        release(object);
+    }
+};
+using Parser = std::unique_ptr<xmlParserCtxt, Release<xmlFreeParserCtxt>>;
+using Document = std::unique_ptr<xmlDoc, Release<xmlFreeDoc>>;
+
+void releaseText(xmlChar* text) {
+    xmlFree(text);
+}
+using Text = std::unique_ptr<xmlChar, Release<releaseText>>;
+
+std::string stringOf(const Text& text) {
+    return text ? reinterpret_cast<const char*>(text.get()) : "";
+}
+
+[[noreturn]] void fail(const std::filesystem::path& file, long line, const std::string& what) {
+    throw Error(file.string() + (line > 0 ? ":" + std::to_string(line) : std::string()) + ": " + what);
+}
+
+std::string contentsOf(const std::filesystem::path& file) {
+    // Without waiting: a FIFO in its place must not hang whoever looks for packages.
+    const Descriptor descriptor(open(file.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    if (!descriptor)
+        fail(file, 0, "cannot be read: " + reasonOf(errno) + "; a package has a tizen-manifest.xml in its folder");
+    struct stat status {};
+    if (fstat(descriptor.get(), &status) != 0 || !S_ISREG(status.st_mode))
+        fail(file, 0, "is not a file");
+    std::string text(largestManifest + 1, '\0');
+    std::size_t length = 0;
+    while (length < text.size()) {
+        const ssize_t count = read(descriptor.get(), text.data() + length, text.size() - length);
+        if (count < 0)
+            fail(file, 0, "cannot be read: " + reasonOf(errno));
+        if (count == 0)
+            break;
+        length += static_cast<std::size_t>(count);
+    }
+    if (length > largestManifest)
+        fail(file, 0, "is larger than 1 MiB; a manifest is not");
+    text.resize(length);
+    return text;
+}
+
+Document parsed(const std::filesystem::path& file) {
+    const std::string text = contentsOf(file);
+    const Parser parser(xmlNewParserCtxt());
+    if (!parser)
+        throw std::bad_alloc();
+    Document document(xmlCtxtReadMemory(parser.get(), text.data(), static_cast<int>(text.size()), nullptr, nullptr,
+                                        XML_PARSE_NONET | XML_PARSE_NOERROR | XML_PARSE_NOWARNING));
+    if (!document) {
+        const xmlError* error = xmlCtxtGetLastError(parser.get());
+        std::string message = error && error->message ? error->message : "it is empty";
+        message.erase(message.find_last_not_of('\n') + 1);
+        fail(file, error ? error->line : 0, "is not well-formed XML: " + message);
+    }
+    // An entity that is defined here could stand for gigabytes.
+    if (document->intSubset)
+        fail(file, 0, "has a document type; remove the <!DOCTYPE>");
+    return document;
+}
+
+std::string_view nameOf(const xmlNode* node) {
+    return node->type == XML_ELEMENT_NODE ? reinterpret_cast<const char*>(node->name) : std::string_view();
+}
+
+std::string attributeOf(xmlNode* node, const char* name) {
+    return stringOf(Text(xmlGetProp(node, reinterpret_cast<const xmlChar*>(name))));
+}
+
+std::string trimmed(const std::string& text) {
+    const std::size_t begin = text.find_first_not_of(" \t\r\n");
+    return begin == std::string::npos ? "" : text.substr(begin, text.find_last_not_of(" \t\r\n") - begin + 1);
+}
+
+xmlNode* childNamed(xmlNode* parent, std::string_view name) {
+    for (xmlNode* child = parent->children; child; child = child->next)
+        if (nameOf(child) == name)
+            return child;
+    return nullptr;
+}
+
+/// The label for all languages; one with a language is for that language only.
+std::string labelOf(xmlNode* application) {
+    for (xmlNode* child = application->children; child; child = child->next)
+        if (nameOf(child) == "label" && !xmlHasProp(child, reinterpret_cast<const xmlChar*>("lang")))
+            return trimmed(stringOf(Text(xmlNodeGetContent(child))));
+    return "";
+}
+
+/// The path of a file that the manifest names below one of the package's folders; "" for no name.
+std::string pathBelow(const std::filesystem::path& folder, const std::string& name, const std::filesystem::path& file,
+                      long line) {
+    if (name.empty())
+        return "";
+    const std::filesystem::path relative = std::filesystem::path(name).lexically_normal();
+    if (relative.is_absolute() || *relative.begin() == "..")
+        fail(file, line, "\"" + name + "\" leads out of the package; give a path below " + folder.string());
+    return (folder / relative).string();
+}
+
+void readApplication(Package& package, xmlNode* application, const std::filesystem::path& file) {
+    const long line = xmlGetLineNo(application);
+    const std::string id = attributeOf(application, "appid");
+    if (id != package.id)
+        fail(file, line,
+             "the application's id \"" + id + "\" differs from the package's, \"" + package.id +
+                 "\"; they must be equal");
+    if (const std::string label = labelOf(application); !label.empty())
+        package.label = label;
+    package.exec = pathBelow(package.root / "bin", attributeOf(application, "exec"), file, line);
+    if (xmlNode* icon = childNamed(application, "icon"))
+        package.icon = pathBelow(package.root / "shared/res", trimmed(stringOf(Text(xmlNodeGetContent(icon)))), file,
+                                 xmlGetLineNo(icon));
+}
+
+}  // namespace
+
+Package readManifest(const std::filesystem::path& root) {
+    const std::filesystem::path file = root / "tizen-manifest.xml";
+    const Document document = parsed(file);
+    xmlNode* manifest = xmlDocGetRootElement(document.get());
+    if (nameOf(manifest) != "manifest")
+        fail(file, xmlGetLineNo(manifest), "the root element must be <manifest>");
+
+    Package package;
+    package.root = root;
+    package.id = attributeOf(manifest, "package");
+    package.version = attributeOf(manifest, "version");
+    package.label = package.id;
+    if (package.id.empty())
+        fail(file, xmlGetLineNo(manifest), "<manifest> has no package id; give it the attribute package=\"...\"");
+    if (!BusName::isValid(package.id))
+        fail(file, xmlGetLineNo(manifest),
+             "\"" + package.id +
+                 "\" is no package id; it needs two or more words of letters, digits, "
+                 "'-' and '_', joined by dots");
+    for (xmlNode* child = manifest->children; child; child = child->next)
+        if (nameOf(child) == "ui-application") {
+            readApplication(package, child, file);
+            break;
+        }
+    return package;
+}
+
+}  // namespace device

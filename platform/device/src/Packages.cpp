@@ -1,0 +1,242 @@
+#include "device/Packages.h"
+
+#include "Files.h"
+#include "PackageFiles.h"
+#include "device/BusName.h"
+#include "device/Database.h"
+#include "device/Error.h"
+#include "device/Events.h"
+#include "device/Folder.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <set>
+#include <utility>
+
+namespace device {
+namespace {
+
+constexpr char temporaryPrefix[] = ".installing-";
+constexpr char lockName[] = ".lock";
+
+/// A folder that goes with everything in it.
+class Scratch {
+public:
+    explicit Scratch(std::filesystem::path folder) : folder_(std::move(folder)) {}
+    ~Scratch() {
+        std::error_code ignored;
+        std::filesystem::remove_all(folder_, ignored);
+    }
+    Scratch(const Scratch&) = delete;
+    Scratch& operator=(const Scratch&) = delete;
+    const std::filesystem::path& path() const { return folder_; }
+
+private:
+    std::filesystem::path folder_;
+};
+
+bool isInside(const std::filesystem::path& path, const std::filesystem::path& folder) {
+    const auto [folderEnd, pathEnd] = std::mismatch(folder.begin(), folder.end(), path.begin(), path.end());
+    return folderEnd == folder.end();
+}
+
+std::filesystem::path checkedSource(const std::filesystem::path& source, const Folder& folder) {
+    std::error_code error;
+    const std::filesystem::path resolved = std::filesystem::canonical(source, error);
+    if (error)
+        throw Error(source.string() + ": " + error.message() + "; name the folder of a package");
+    if (!std::filesystem::is_directory(resolved, error))
+        throw Error(source.string() + ": is not a folder; name the folder of a package");
+    if (isInside(resolved, folder.root()) || isInside(folder.root(), resolved))
+        throw Error(source.string() + ": the device's own folder " + folder.root().string() +
+                    " and the package lie in each other; install from another folder");
+    return resolved;
+}
+
+void makeAppsFolder(const std::filesystem::path& apps) {
+    std::error_code error;
+    std::filesystem::create_directories(apps, error);
+    if (error)
+        throw Error(apps.string() + ": cannot be made: " + error.message() + "; make the device's folder writable");
+}
+
+std::set<std::string> foldersIn(const std::filesystem::path& parent) {
+    std::set<std::string> names;
+    std::error_code error;
+    for (const auto& entry : std::filesystem::directory_iterator(parent, error))
+        if (entry.is_directory(error))
+            names.insert(entry.path().filename().string());
+    return names;
+}
+
+std::optional<std::string> stateOf(Database& database, const std::string& id) {
+    return database.guarded([&]() -> std::optional<std::string> {
+        const auto row = database.query("SELECT state FROM package WHERE id = ?", id);
+        if (!row->executeStep())
+            return std::nullopt;
+        return row->getColumn(0).getString();
+    });
+}
+
+void setState(Database& database, const std::string& id, const std::string& state) {
+    database.guarded([&] {
+        database
+            .query("INSERT INTO package (id, state) VALUES (?, ?) ON CONFLICT DO UPDATE SET state = excluded.state", id,
+                   state)
+            ->exec();
+    });
+}
+
+void forgetState(Database& database, const std::string& id) {
+    database.guarded([&] { database.query("DELETE FROM package WHERE id = ?", id)->exec(); });
+}
+
+/// What an installation or a removal that was cut short has left.
+void removeRemains(Database& database, const std::filesystem::path& apps) {
+    for (const std::string& name : foldersIn(apps))
+        if (name.rfind(temporaryPrefix, 0) == 0 || stateOf(database, name) != "installed")
+            Scratch(apps / name);
+}
+
+}  // namespace
+
+Packages::Packages(Database& database, Events& events, const Folder& folder,
+                   std::vector<std::filesystem::path> preinstalled)
+    : database_(database), events_(events), folder_(folder), preinstalled_(std::move(preinstalled)) {}
+
+std::optional<std::filesystem::path> Packages::rootOf(const std::string& id) const {
+    if (!BusName::isValid(id))
+        return std::nullopt;
+    std::error_code error;
+    const std::optional<std::string> state = stateOf(database_, id);
+    if (state == "removed")
+        return std::nullopt;
+    if (state == "installed" && std::filesystem::is_directory(folder_.apps() / id, error))
+        return folder_.apps() / id;
+    for (const std::filesystem::path& folder : preinstalled_)
+        if (std::filesystem::is_directory(folder / id, error))
+            return folder / id;
+    return std::nullopt;
+}
+
+Package Packages::read(const std::string& id, const std::filesystem::path& root) const {
+    Package package = readManifest(root);
+    if (package.id != id)
+        throw Error((root / "tizen-manifest.xml").string() + ": the package's id \"" + package.id +
+                    "\" differs from the name of its folder; they must be equal");
+    package.preinstalled = root.parent_path() != folder_.apps();
+    return package;
+}
+
+std::optional<Package> Packages::find(const std::string& id) const {
+    const std::optional<std::filesystem::path> root = rootOf(id);
+    return root ? std::optional(read(id, *root)) : std::nullopt;
+}
+
+std::vector<Package> Packages::all() const {
+    std::set<std::string> ids = foldersIn(folder_.apps());
+    for (const std::filesystem::path& folder : preinstalled_)
+        ids.merge(foldersIn(folder));
+    std::vector<Package> packages;
+    for (const std::string& id : ids) {
+        const std::optional<std::filesystem::path> root = rootOf(id);
+        if (!root)
+            continue;
+        try {
+            packages.push_back(read(id, *root));
+        } catch (const Error&) {
+            continue;
+        }
+    }
+    return packages;
+}
+
+Package Packages::install(const std::filesystem::path& source) {
+    const std::filesystem::path from = checkedSource(source, folder_);
+    const std::string id = readManifest(from).id;
+    PackageEvent event{id, rootOf(id) ? PackageEvent::Type::Update : PackageEvent::Type::Install};
+    events_.publishPackage(event);
+    try {
+        place(from, id, event);
+    } catch (const std::exception&) {
+        publishFailure(event);
+        throw;
+    }
+    publishCompletion(event);
+    return read(id, folder_.apps() / id);
+}
+
+void Packages::place(const std::filesystem::path& from, const std::string& id, PackageEvent event) {
+    makeAppsFolder(folder_.apps());
+    const FileLock lock(folder_.apps() / lockName);
+    removeRemains(database_, folder_.apps());
+    const Scratch fresh(makeTemporaryFolder(folder_.apps(), temporaryPrefix));
+    copyPackage(from, fresh.path());
+    if (readManifest(fresh.path()).id != id)
+        throw Error(from.string() + ": changed while it was copied; install it again");
+    event.state = PackageEvent::State::Processing;
+    event.progress = 50;
+    events_.publishPackage(event);
+    commit(fresh.path(), id);
+}
+
+void Packages::commit(const std::filesystem::path& fresh, const std::string& id) {
+    const std::filesystem::path target = folder_.apps() / id;
+    replaceFolder(fresh, target);
+    try {
+        setState(database_, id, "installed");
+    } catch (const Error&) {
+        // Nothing may have changed: put back what stood there, or take the new folder away again.
+        std::error_code ignored;
+        if (std::filesystem::exists(fresh, ignored))
+            replaceFolder(fresh, target);
+        else
+            std::filesystem::rename(target, fresh, ignored);
+        throw;
+    }
+}
+
+void Packages::uninstall(const std::string& id) {
+    if (!rootOf(id))
+        throw Error("\"" + id + "\" is not installed; see the device's list of packages");
+    PackageEvent event{id, PackageEvent::Type::Uninstall};
+    events_.publishPackage(event);
+    try {
+        remove(id, event);
+    } catch (const std::exception&) {
+        publishFailure(event);
+        throw;
+    }
+    publishCompletion(event);
+}
+
+void Packages::remove(const std::string& id, PackageEvent event) {
+    makeAppsFolder(folder_.apps());
+    const FileLock lock(folder_.apps() / lockName);
+    event.state = PackageEvent::State::Processing;
+    event.progress = 50;
+    events_.publishPackage(event);
+    std::error_code error;
+    const bool shipped = std::any_of(preinstalled_.begin(), preinstalled_.end(), [&](const auto& folder) {
+        return std::filesystem::is_directory(folder / id, error);
+    });
+    if (shipped)
+        setState(database_, id, "removed");
+    else
+        forgetState(database_, id);
+    Scratch(folder_.apps() / id);
+}
+
+void Packages::publishCompletion(PackageEvent event) {
+    event.state = PackageEvent::State::Completed;
+    event.progress = 100;
+    events_.publishPackage(event);
+}
+
+void Packages::publishFailure(PackageEvent event) {
+    event.state = PackageEvent::State::Failed;
+    event.error = -EIO;
+    events_.publishPackage(event);
+}
+
+}  // namespace device
