@@ -116,9 +116,19 @@ bool runFor(double seconds) {
 }
 
 void inMainLoop(const std::function<void()>& function) {
-    const auto call = [](void* data) { (*static_cast<const std::function<void()>*>(data))(); };
-    ecore_job_add(call, const_cast<std::function<void()>*>(&function));
-    runFor(0.0);
+    struct Call {
+        const std::function<void()>& function;
+        bool done = false;
+    } call{function};
+    ecore_job_add(
+        [](void* data) {
+            auto* due = static_cast<Call*>(data);
+            due->function();
+            due->done = true;
+        },
+        &call);
+    while (!call.done)
+        runFor(0.0);
 }
 
 bool hasEnded() {
