@@ -26,9 +26,12 @@ TEST(Preferences, GiveBackWhatWasStoredAlsoAfterTheDeviceIsOpenedAnew) {
 TEST(Preferences, KeepEveryByte) {
     const TemporaryDevice device;
     using namespace std::string_literals;
-    const std::vector<std::string> texts{""s,          "it's \"quoted\"; DROP TABLE preference; --"s,
-                                         "\xff\xfe\x80 no UTF-8"s, "a zero \0 inside"s,
-                                         std::string(1024 * 1024, 'x'), "\n\r\t"s};
+    const std::vector<std::string> texts{""s,
+                                         "it's \"quoted\"; DROP TABLE preference; --"s,
+                                         "\xff\xfe\x80 no UTF-8"s,
+                                         "a zero \0 inside"s,
+                                         std::string(1024 * 1024, 'x'),
+                                         "\n\r\t"s};
     for (const std::string& text : texts) {
         device->preferences().set("com.example.app", text, text);
         EXPECT_EQ(device->preferences().get("com.example.app", text), text);

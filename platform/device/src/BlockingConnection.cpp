@@ -29,14 +29,16 @@ std::string secondsOf(std::chrono::milliseconds time) {
     return text;
 }
 
-[[noreturn]] void fail(const Failure& failure, const Message& call, std::chrono::milliseconds timeout) {
-    const char* destination = dbus_message_get_destination(call.get());
+constexpr char busHasGone[] = "the device's bus has gone; start the device anew";
+
+[[noreturn]] void fail(const Failure& failure, const std::string& destination, bool inTime,
+                       std::chrono::milliseconds timeout) {
     if (failure.name() == DBUS_ERROR_SERVICE_UNKNOWN || failure.name() == DBUS_ERROR_NAME_HAS_NO_OWNER)
-        throw NotRunning(std::string(destination) + " is not running");
+        throw NotRunning(destination + " is not running");
+    if (failure.name() == DBUS_ERROR_NO_REPLY && inTime)
+        throw Error(destination + " ended before it answered");
     if (failure.name() == DBUS_ERROR_NO_REPLY || failure.name() == DBUS_ERROR_TIMEOUT)
-        throw Error(std::string(destination) + " did not answer within " + secondsOf(timeout) + " s");
-    if (failure.name() == DBUS_ERROR_DISCONNECTED)
-        throw Error("the device's bus has gone; start the device anew");
+        throw Error(destination + " did not answer within " + secondsOf(timeout) + " s");
     throw Error(failure.message());
 }
 
@@ -62,13 +64,17 @@ BlockingConnection::~BlockingConnection() {
 
 Message BlockingConnection::answerTo(const Message& call, std::chrono::milliseconds timeout) {
     Failure failure;
+    const auto begin = std::chrono::steady_clock::now();
     Message answer(dbus_connection_send_with_reply_and_block(connection_, call.get(), static_cast<int>(timeout.count()),
                                                              failure.get()));
     // Signals to this connection are nobody's business; unread they would pile up.
     while (Message unasked{dbus_connection_pop_message(connection_)}) {
     }
+    if (!answer && !dbus_connection_get_is_connected(connection_))
+        throw Error(busHasGone);
     if (!answer)
-        fail(failure, call, timeout);
+        fail(failure, dbus_message_get_destination(call.get()), std::chrono::steady_clock::now() - begin < timeout,
+             timeout);
     return answer;
 }
 

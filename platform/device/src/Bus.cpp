@@ -22,18 +22,14 @@ std::string bus::pathOf(const std::string& appId) {
 
 namespace {
 
-/// Keeps Eldbus, and Ecore below it, in use.
-class Eldbus {
-public:
-    Eldbus() {
-        // Ecore's system modules report battery and time zone over the system bus; where there is none they complain.
-        setenv("ECORE_NO_SYSTEM_MODULES", "1", 0);
-        eldbus_init();
-    }
-    ~Eldbus() { eldbus_shutdown(); }
-    Eldbus(const Eldbus&) = delete;
-    Eldbus& operator=(const Eldbus&) = delete;
-};
+/// Starts Eldbus, and Ecore below it, once for the whole process: EFL does not bear being ended and begun again
+/// while child processes come and go.
+void startEldbus() {
+    // Ecore's system modules report battery and time zone over the system bus; where there is none they complain.
+    static const bool started = setenv("ECORE_NO_SYSTEM_MODULES", "1", 0) == 0 && eldbus_init() > 0;
+    if (!started)
+        throw Error("Eldbus cannot be started; check the installation of EFL");
+}
 
 constexpr double answerTimeoutInMilliseconds = 5000;
 
@@ -47,9 +43,10 @@ struct Bus::Link {
 
     static void whenDisconnected(void* link, Eldbus_Connection* connection, void* event);
     static void tellLost(void* link);
+    static void flush(void* link);
+    void ping() const;
     unsigned callOfBus(const char* method, const std::string& name, const unsigned* flags) const;
 
-    Eldbus eldbus;
     Folder folder;
     std::string address;
     Eldbus_Connection* connection = nullptr;
@@ -58,6 +55,7 @@ struct Bus::Link {
     std::unique_ptr<BlockingConnection> blocking;
     std::function<void()> lost;
     Ecore_Job* telling = nullptr;
+    Ecore_Job* flushing = nullptr;
     bool alive = true;
 };
 
@@ -73,6 +71,8 @@ Bus::Link::Link(const Folder& device, std::string at)
 Bus::Link::~Link() {
     if (telling)
         ecore_job_del(telling);
+    if (flushing)
+        ecore_job_del(flushing);
     if (!connection)
         return;
     eldbus_connection_event_callback_del(connection, ELDBUS_CONNECTION_EVENT_DISCONNECTED, whenDisconnected, this);
@@ -101,6 +101,22 @@ void Bus::Link::tellLost(void* link) {
     }
 }
 
+void Bus::Link::flush(void* link) {
+    auto* self = static_cast<Link*>(link);
+    self->flushing = nullptr;
+    try {
+        if (self->alive)
+            self->ping();
+    } catch (const std::exception&) {
+        // The bus has just gone, and whoever wants to know is told by whenDisconnected().
+        return;
+    }
+}
+
+void Bus::Link::ping() const {
+    callOfBus("GetConnectionUnixProcessID", ELDBUS_FDO_BUS, nullptr);
+}
+
 unsigned Bus::Link::callOfBus(const char* method, const std::string& name, const unsigned* flags) const {
     Eldbus_Message* call = eldbus_proxy_method_call_new(busProxy, method);
     eldbus_message_arguments_append(call, "s", name.c_str());
@@ -120,6 +136,7 @@ std::unique_ptr<Bus> Bus::connect(const Folder& folder) {
     for (const std::string& address : busAddresses(folder)) {
         if (!answers(address))
             continue;
+        startEldbus();
         auto link = std::make_unique<Link>(folder, address);
         if (link->connection)
             return std::make_unique<Bus>(std::move(link));
@@ -147,6 +164,11 @@ void Bus::onLost(std::function<void()> handler) {
     link_->lost = std::move(handler);
 }
 
+void Bus::flushSoon() const {
+    if (!link_->flushing)
+        link_->flushing = ecore_job_add(Link::flush, link_.get());
+}
+
 BlockingConnection& Bus::blocking() const {
     if (!link_->alive)
         throw Error("the device's bus has gone; start the device anew");
@@ -155,7 +177,7 @@ BlockingConnection& Bus::blocking() const {
     const auto timeout = std::chrono::milliseconds(static_cast<int>(answerTimeoutInMilliseconds));
     // Asked first on the connection that can say no in peace, then on the other, behind all that it has sent.
     link_->blocking->answerTo(BlockingConnection::callOfBus("GetId"), timeout);
-    link_->callOfBus("GetConnectionUnixProcessID", ELDBUS_FDO_BUS, nullptr);
+    link_->ping();
     return *link_->blocking;
 }
 

@@ -41,11 +41,11 @@ void createSchema(SQLite::Database& sql) {
 }
 
 void useWriteAheadLog(SQLite::Database& sql, const std::filesystem::path& file) {
+    sql.exec("PRAGMA synchronous = NORMAL");
     const std::string mode = sql.execAndGet("PRAGMA journal_mode = WAL").getString();
     if (mode != "wal")
         throw Error(file.string() + ": the file system cannot share it between processes (journal mode " + mode +
                     "); put the device on a local disk with KEST_DEVICE");
-    sql.exec("PRAGMA synchronous = NORMAL");
 }
 
 /// SQLite would open some of these and wait, or say only that it cannot.

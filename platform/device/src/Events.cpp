@@ -9,6 +9,7 @@
 #include <cstdint>
 #include <cstdio>
 #include <exception>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -17,6 +18,7 @@ namespace {
 
 constexpr char settingSignal[] = "SettingChanged";
 constexpr char packageSignal[] = "PackageChanged";
+constexpr std::size_t longestName = 64 * 1024;  // a larger message could stay half sent: see Bus::flushSoon()
 
 /// The handlers of one kind of event, in the order in which they subscribed.
 template <class... Values>
@@ -59,6 +61,12 @@ private:
     std::vector<std::shared_ptr<Handler>> entries_;
 };
 
+/// Eldbus complains on standard error about arguments that are not what is asked for.
+bool hasArguments(const Eldbus_Message* signal, std::string_view types) {
+    const char* signature = eldbus_message_signature_get(signal);
+    return signature && signature == types;
+}
+
 }  // namespace
 
 struct Events::State {
@@ -71,7 +79,7 @@ struct Events::State {
     void disconnect();
     Eldbus_Message* newSignal(const char* member) const;
     void send(Eldbus_Message* signal) const;
-    bool canSend(const std::string& text) const { return connection && isUtf8(text); }
+    bool canSend(const std::string& text) const { return connection && text.size() <= longestName && isUtf8(text); }
 
     static void whenConnectionEnds(void* state, const void* connection);
     static void whenBusIsLost(void* state, Eldbus_Connection* connection, void* event);
@@ -119,10 +127,8 @@ void Events::State::send(Eldbus_Message* signal) const {
 }
 
 void Events::State::whenConnectionEnds(void* state, const void*) {
-    auto* self = static_cast<State*>(state);
-    eldbus_signal_handler_del(self->settingSignals);
-    eldbus_signal_handler_del(self->packageSignals);
-    self->connection = nullptr;
+    // Eldbus ends the connection's signal handlers itself.
+    static_cast<State*>(state)->connection = nullptr;
 }
 
 void Events::State::whenBusIsLost(void* state, Eldbus_Connection*, void*) {
@@ -133,7 +139,8 @@ void Events::State::whenSettingChanged(void* state, const Eldbus_Message* signal
     const char* folder = nullptr;
     const char* key = nullptr;
     auto* self = static_cast<State*>(state);
-    if (!eldbus_message_arguments_get(signal, "ss", &folder, &key) || self->folder != folder)
+    if (!hasArguments(signal, "ss") || !eldbus_message_arguments_get(signal, "ss", &folder, &key) ||
+        self->folder != folder)
         return;
     const auto handlers = self->settings;
     handlers->call(key);
@@ -147,7 +154,8 @@ void Events::State::whenPackageChanged(void* state, const Eldbus_Message* signal
     std::int32_t progress = 0;
     std::int32_t error = 0;
     auto* self = static_cast<State*>(state);
-    if (!eldbus_message_arguments_get(signal, "ssuuii", &folder, &id, &type, &progressState, &progress, &error) ||
+    if (!hasArguments(signal, "ssuuii") ||
+        !eldbus_message_arguments_get(signal, "ssuuii", &folder, &id, &type, &progressState, &progress, &error) ||
         self->folder != folder)
         return;
     if (type > static_cast<std::uint32_t>(PackageEvent::Type::Update) ||

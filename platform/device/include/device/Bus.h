@@ -49,6 +49,11 @@ public:
     /// Called from the main loop when the bus goes away while the process runs; may destroy this object.
     void onLost(std::function<void()> handler);
 
+    /// Has the main loop wait, at its next turn, until the bus has taken all that was sent on connection(). To be
+    /// called by whoever sends a message or an answer of more than 64 KiB: Eldbus forgets the rest of a message that
+    /// the socket does not take at once, until it sends the next one.
+    void flushSoon() const;
+
     /// A second connection, for calls that wait for their answer without a main loop; opened at the first call.
     /// All that was sent on connection() before has reached the bus when this returns. For BusName and BusCall.
     /// Throws Error when the bus does not answer.

@@ -37,7 +37,8 @@ public:
     [[nodiscard]] Subscription onPackage(PackageHandler handler);
 
     /// Without a bus: calls this process's handlers at once, in the order in which they subscribed.
-    /// With one: sends a signal that reaches every process of the device, this one included, from its main loop.
+    /// With one: sends a signal that reaches every process of the device, this one included, from its main loop. A
+    /// key that the bus cannot carry (not UTF-8, or longer than 64 KiB) reaches this process's handlers only.
     void publishSetting(const std::string& key);
     void publishPackage(const PackageEvent& event);
 
