@@ -45,34 +45,32 @@ uxt_font_table* Appearance::add(uxt_font_table table) {
 }
 
 bool Appearance::remove(const uxt_color_table* table) {
-    const auto found = find(colourTables_, table);
-    if (found == colourTables_.end())
-        return false;
-    const auto forget = [table](TableChoice& choice) {
-        if (choice.colours == table)
-            choice.colours = nullptr;
-    };
-    forget(application_);
-    for (auto& [object, own] : objects_)
-        forget(own.choice);
-    colourTables_.erase(found);
-    refresh();
-    return true;
+    return removeFrom(colourTables_, table, &TableChoice::colours);
 }
 
 bool Appearance::remove(const uxt_font_table* table) {
-    const auto found = find(fontTables_, table);
-    if (found == fontTables_.end())
+    return removeFrom(fontTables_, table, &TableChoice::fonts);
+}
+
+template <typename Table>
+bool Appearance::removeFrom(std::vector<std::unique_ptr<Table>>& tables, const Table* table,
+                            const Table* TableChoice::*place) {
+    const auto found = find(tables, table);
+    if (found == tables.end())
         return false;
-    const auto forget = [table](TableChoice& choice) {
-        if (choice.fonts == table)
-            choice.fonts = nullptr;
+    bool isUsed = false;
+    const auto forget = [&](TableChoice& choice) {
+        if (choice.*place != table)
+            return;
+        choice.*place = nullptr;
+        isUsed = true;
     };
     forget(application_);
     for (auto& [object, own] : objects_)
         forget(own.choice);
-    fontTables_.erase(found);
-    refresh();
+    tables.erase(found);
+    if (isUsed)
+        refresh();
     return true;
 }
 

@@ -49,6 +49,8 @@ private:
         std::unique_ptr<ObjectAppearance> appearance;
     };
 
+    template <typename Table>
+    bool removeFrom(std::vector<std::unique_ptr<Table>>& tables, const Table* table, const Table* TableChoice::*place);
     static void objectDeleted(void* self, Evas*, Evas_Object* object, void*);
     Object& objectFor(Evas_Object* object);
     void check(const TableChoice& choice) const;

@@ -71,12 +71,20 @@ void ObjectAppearance::beforeFrame(void* self, Evas* canvas, void*) {
     guarded("an object's colours", [&] {
         // Rows and pages that the frame will show are made while sizes are worked out.
         evas_smart_objects_calculate(canvas);
-        auto* appearance = static_cast<ObjectAppearance*>(self);
-        appearance->forEachLayout(appearance->object_, [appearance](Evas_Object* layout) {
-            if (evas_object_data_get(layout, ownerKey) != appearance->object_)
-                appearance->adopt(layout);
-        });
+        if (static_cast<ObjectAppearance*>(self)->adoptNewLayouts())
+            evas_smart_objects_calculate(canvas);
     });
+}
+
+bool ObjectAppearance::adoptNewLayouts() {
+    bool isAnyNew = false;
+    forEachLayout(object_, [&](Evas_Object* layout) {
+        if (evas_object_data_get(layout, ownerKey) == object_)
+            return;
+        adopt(layout);
+        isAnyNew = true;
+    });
+    return isAnyNew;
 }
 
 void ObjectAppearance::adopt(Evas_Object* layout) {

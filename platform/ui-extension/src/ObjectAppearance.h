@@ -21,6 +21,8 @@ public:
 private:
     static void beforeFrame(void* self, Evas*, void*);
     void watchForNewLayouts(bool watch);
+    /// False when there were none.
+    bool adoptNewLayouts();
     void adopt(Evas_Object* layout);
     void forEachLayout(Evas_Object* object, const std::function<void(Evas_Object*)>& visit) const;
 

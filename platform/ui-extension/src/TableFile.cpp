@@ -32,10 +32,25 @@ std::string withoutLineEnd(const char* message) {
     return text;
 }
 
+/// What stopped a parser; the first thing counts, the others follow from it.
+struct Complaint {
+    long line = 0;
+    std::string what;
+};
+
+void note(xmlParserCtxt* context, long line, const std::string& what) {
+    auto* complaint = static_cast<Complaint*>(context->_private);
+    if (complaint->what.empty())
+        *complaint = {line, what};
+}
+
+void noteError(void* parser, xmlError* error) {
+    note(static_cast<xmlParserCtxt*>(parser), error->line, withoutLineEnd(error->message));
+}
+
 void refuseDocumentType(void* parser, const xmlChar*, const xmlChar*, const xmlChar*) {
     auto* context = static_cast<xmlParserCtxt*>(parser);
-    // Read by parse(); the document itself is dropped.
-    context->_private = parser;
+    note(context, context->input->line, "a document type is not allowed");
     xmlStopParser(context);
 }
 
@@ -44,16 +59,23 @@ Document parse(const std::string& file) {
     const Context context(xmlNewParserCtxt());
     if (!context)
         throw std::bad_alloc();
+    Complaint complaint;
+    context->_private = &complaint;
+    context->sax->serror = noteError;
     // Without a document type there are no entities but the five that XML has.
     context->sax->internalSubset = refuseDocumentType;
-    Document document(
-        xmlCtxtReadMemory(context.get(), text.data(), static_cast<int>(text.size()), nullptr, nullptr,
-                          XML_PARSE_NONET | XML_PARSE_NOERROR | XML_PARSE_NOWARNING | XML_PARSE_BIG_LINES));
-    if (context->_private)
-        throw TableError(file, context->input ? context->input->line : 1, "a document type is not allowed");
-    if (!document || !context->wellFormed)
-        throw TableError(file, context->lastError.line, withoutLineEnd(context->lastError.message));
+    Document document(xmlCtxtReadMemory(context.get(), text.data(), static_cast<int>(text.size()), nullptr, nullptr,
+                                        XML_PARSE_NONET | XML_PARSE_BIG_LINES));
+    if (!complaint.what.empty())
+        throw TableError(file, complaint.line, complaint.what);
+    if (!document)
+        throw TableError(file, "is not well-formed");
     return document;
+}
+
+/// Where an author looks for it. (The parser gives a text the line in which it ends.)
+long lineOf(const xmlNode* node) {
+    return xmlGetLineNo(node->type == XML_TEXT_NODE ? node->parent : node);
 }
 
 bool isBlank(const xmlNode* node) {
@@ -80,7 +102,7 @@ TableEntry readEntry(const std::string& file, const xmlNode* node, const TableSh
     }
     for (const xmlNode* child = node->children; child; child = child->next) {
         if (!isBlank(child))
-            throw TableError(file, xmlGetLineNo(child), quoted(node->name) + " holds nothing");
+            throw TableError(file, lineOf(child), quoted(node->name) + " holds nothing");
     }
     return entry;
 }
@@ -109,8 +131,7 @@ std::vector<TableEntry> readTableFile(const std::string& file, const TableShape&
         if (isBlank(node))
             continue;
         if (!isNamed(node, shape.entry))
-            throw TableError(file, xmlGetLineNo(node),
-                             "\"" + shape.root + "\" holds \"" + shape.entry + "\" elements only");
+            throw TableError(file, lineOf(node), "\"" + shape.root + "\" holds \"" + shape.entry + "\" elements only");
         entries.push_back(readEntry(file, node, shape));
         const std::string& key = entries.back().values[shape.attributes.front()];
         const auto [first, isNew] = lines.emplace(key, entries.back().line);

@@ -4,6 +4,7 @@
 #include "AutoScroll.h"
 #include "ChangedCallbacks.h"
 #include "Log.h"
+#include "TableFile.h"
 
 #include <stdexcept>
 
@@ -33,22 +34,29 @@ void chooseForApplication(const char* function, const std::function<void(TableCh
     guarded(function, [&] { Appearance::ofProcess().choose(nullptr, change); });
 }
 
-std::string givenPath(const char* path) {
-    if (!path)
-        throw std::invalid_argument("no file is named");
-    return path;
+template <typename Table>
+Table* addTable(const char* function, Table (*read)(const std::string&), const char* path) {
+    return guarded(function, static_cast<Table*>(nullptr), [read, path]() -> Table* {
+        if (!path)
+            throw std::invalid_argument("no file is named");
+        try {
+            return Appearance::ofProcess().add(read(path));
+        } catch (const uxt::TableError& error) {
+            // As a compiler says it, so that an editor finds the place.
+            dlog_print(DLOG_ERROR, uxt::logTag, "%s", error.what());
+            return nullptr;
+        }
+    });
 }
 
 }  // namespace
 
 uxt_color_table_h uxt_theme_add_color_table(const char* path) {
-    return guarded(__func__, uxt_color_table_h{},
-                   [path] { return Appearance::ofProcess().add(uxt::readColorTable(givenPath(path))); });
+    return addTable<uxt_color_table>(__func__, uxt::readColorTable, path);
 }
 
 uxt_font_table_h uxt_theme_add_font_table(const char* path) {
-    return guarded(__func__, uxt_font_table_h{},
-                   [path] { return Appearance::ofProcess().add(uxt::readFontTable(givenPath(path))); });
+    return addTable<uxt_font_table>(__func__, uxt::readFontTable, path);
 }
 
 void uxt_theme_delete_color_table(uxt_color_table_h table) {
