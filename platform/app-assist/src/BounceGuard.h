@@ -5,7 +5,8 @@
 namespace app_assist {
 
 /// Ends what EFL leaves going: after a sideways bounce at the first or last page it goes on to animate a scroller
-/// that stands still, and says "scroll,anim,stop" at every frame, for ever.
+/// that stands still, and says "scroll,anim,stop" at every frame, for ever. With the guard it says so twice at once:
+/// when the bounce ends, and when its animation is taken away.
 class BounceGuard {
 public:
     /// For as long as the scroller lives.
