@@ -26,6 +26,8 @@ bool WView::create(Evas_Object* parent, void* viewParam) {
     evasObject_ = onCreate(parent, viewParam);
     if (!evasObject_)
         return false;
+    // Whoever looks at the screen from outside finds the view by this name.
+    evas_object_name_set(evasObject_, getClassName());
     evas_object_event_callback_add(evasObject_, EVAS_CALLBACK_DEL, evasObjectGoes, this);
     evas_object_event_callback_add(evasObject_, EVAS_CALLBACK_FREE, evasObjectGone, this);
     onCreated();
