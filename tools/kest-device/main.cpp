@@ -13,7 +13,7 @@ constexpr int wrongUsage = 2;
 
 constexpr char about[] =
     "Runs and controls a device on this workstation: its applications, settings, packages, log and\n"
-    "screen. A device is a folder: $KEST_DEVICE, else kest-device in the user's state folder.";
+    "screen. A device is a folder: $KEST_DEVICE, else kest-device in the user's state folder.\n";
 
 constexpr char examples[] = R"(Examples:
   kest-device start --headless            start Tips without a display
@@ -44,6 +44,8 @@ void describe(CLI::App& app, tool::Session& session) {
     app.set_help_flag("-h,--help", "Print this help and end");
     app.footer(examples);
     app.require_subcommand(1);
+    app.get_formatter()->label("SUBCOMMAND", "COMMAND");
+    app.get_formatter()->label("Subcommands", "Commands");
     for (const auto add :
          {tool::addStart, tool::addStop,        tool::addStatus,  tool::addReset,     tool::addGet,
           tool::addSet,   tool::addUnset,       tool::addInstall, tool::addUninstall, tool::addPackages,
@@ -61,6 +63,19 @@ bool isUtf8(const char* text) {
     } catch (const tool::Json::type_error&) {
         return false;
     }
+}
+
+/// What is wrong with the command line, in the words of this tool.
+std::string mistake(const CLI::App& app, const CLI::ParseError& error, int argc, char** argv) {
+    if (!app.get_subcommands().empty()) {
+        return error.what();
+    }
+    for (int i = 1; i < argc; ++i) {
+        if (argv[i][0] != '-') {
+            return "there is no command \"" + std::string(argv[i]) + '"';
+        }
+    }
+    return argc > 1 ? error.what() : "a command is missing";
 }
 
 /// The command whose help explains the mistake.
@@ -83,7 +98,7 @@ int run(int argc, char** argv) {
     } catch (const CLI::Success& request) {
         return app.exit(request);
     } catch (const CLI::ParseError& error) {
-        return sayError(std::string(error.what()) + "; see '" + helpCommand(app) + "'", wrongUsage);
+        return sayError(mistake(app, error, argc, argv) + "; see '" + helpCommand(app) + "'", wrongUsage);
     } catch (const tool::UsageError& error) {
         return sayError(std::string(error.what()) + "; see '" + helpCommand(app) + "'", wrongUsage);
     }

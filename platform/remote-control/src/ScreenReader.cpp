@@ -29,6 +29,20 @@ bool opaqueEnough(const Evas_Object* object) {
     return alpha > 0;
 }
 
+bool isWidget(const Evas_Object* object) {
+    return object && elm_object_widget_check(object);
+}
+
+bool holdsSomething(const Element& element) {
+    return !element.name.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
+           !element.items.empty();
+}
+
+/// Not so for the empty helpers that windows keep at hand, nor for the window itself, whose contents lie beside it.
+bool tellsSomething(const Element& element) {
+    return holdsSomething(element) || (!element.place.empty() && element.type != "Elm_Win");
+}
+
 /// The objects that draw have no members, and EFL complains when it is asked for them.
 bool canHaveMembers(std::string_view type) {
     static constexpr std::array drawing{"rectangle", "line", "polygon", "text", "textblock", "textgrid", "image", "vg"};
@@ -99,8 +113,11 @@ Rectangle ScreenReader::seenOf(Evas_Object* object, bool shown) const {
 void ScreenReader::readInto(Element& parent, Evas_Object* object, bool parentShown) {
     const std::string type = orEmpty(evas_object_type_get(object));
     const bool shown = parentShown && evas_object_visible_get(object);
-    if (elm_object_widget_check(object)) {
-        parent.children.push_back(readWidget(object, shown));
+    if (isWidget(object)) {
+        Element widget = readWidget(object, shown);
+        if (tellsSomething(widget)) {
+            parent.children.push_back(std::move(widget));
+        }
     } else if (type == "edje") {
         readThemed(parent, object, shown);
     } else if (type == "text" && evas_object_visible_get(object)) {
@@ -142,7 +159,7 @@ void ScreenReader::readThemed(Element& parent, Evas_Object* object, bool shown) 
     const char* file = nullptr;
     const char* group = nullptr;
     edje_object_file_get(object, &file, &group);
-    const bool widgetsOwn = elm_object_widget_check(evas_object_smart_parent_get(object)) && parent.group.empty();
+    const bool widgetsOwn = isWidget(evas_object_smart_parent_get(object)) && parent.group.empty();
     Element own;
     own.type = "Edje";
     own.name = orEmpty(evas_object_name_get(object));
@@ -159,7 +176,7 @@ void ScreenReader::readThemed(Element& parent, Evas_Object* object, bool shown) 
     if (element.texts.size() > firstText) {
         parts_.nameParts(object, element.texts);
     }
-    if (!widgetsOwn && (!own.texts.empty() || !own.children.empty() || !own.name.empty() || isRow(own))) {
+    if (!widgetsOwn && (holdsSomething(own) || isRow(own))) {
         parent.children.push_back(std::move(own));
     }
 }
