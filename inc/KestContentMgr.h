@@ -32,11 +32,11 @@ private:
 
     // The main menu file and the detail files.
     bool __loadMainMenu();
-    void __addMenu(xmlNode* menu);
+    static KestContentInfo __readMenu(const xmlNode* menu);
     bool __loadDetailMenu(KestContentInfo& record);
     void __readDetail(xmlNode* node, KestContentInfo& record);
-    void __loadContents(KestContentInfo& record, const std::string& text);
-    static std::string __cleanOldContents(const std::string& contents);
+    /// `cleaned` is the element's text without what old contents have too much.
+    void __setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned);
     std::string __convertHrefPath(const std::string& appid, const std::string& text);
 
     // String resources and translation.
@@ -45,13 +45,10 @@ private:
     /// The translation of the node's "id" attribute, which goes to `usedId`; `text` where there is none.
     std::string __translateById(xmlNode* node, const std::string& domain, const std::string& text, std::string& usedId);
     bool __isStringAvailable(const std::string& id, const std::string& domain);
+    /// Null when no string file has the id in the display language.
+    const std::string* __findInStringTable(const std::string& id) const;
     std::string __getString(const std::string& id, const std::string& domain);
-    std::string __translateContents(const std::string& domain, std::string contents);
-
-    static std::string __replaceString(const std::string& text, const std::string& from, const std::string& to,
-                                       bool firstOnly);
-    static std::string __extractString(const std::string& text, const std::string& start, const std::string& end,
-                                       bool inclusive);
+    std::string __translateContents(const std::string& domain, const std::string& contents);
 
     // The preference cache and what decides whether it is valid.
     bool __checkCacheAvailable();

@@ -3,8 +3,10 @@
 #include "KestCommon.h"
 #include "KestContentCache.h"
 #include "KestLog.h"
+#include "KestMarkup.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
+#include "KestTextTags.h"
 #include "KestXml.h"
 
 #include <libintl.h>
@@ -18,10 +20,6 @@ const char menuFile[] = "contents/kest_menu.xml";
 const char languageKey[] = "db/menu_widget/language";
 const char ownDomain[] = "kest";
 const char systemDomain[] = "sys_string";
-
-/// A translation may bring text tags of its own; past these bounds the text stays as it stands.
-const int mostReplacements = 10000;
-const size_t longestContents = 1024 * 1024;
 
 /// The log's words for a file that could not be used; null when it could.
 const char* failureOf(KestXmlDocument::Result result) {
@@ -40,9 +38,8 @@ bool hasTranslation(const char* domain, const std::string& id) {
     return id != dgettext(domain, id.c_str());
 }
 
-/// The two prefixes, of five and of two characters, under which the string table knows a display language.
-std::string languagePrefix(const KestPlatformString& language, size_t length) {
-    return language.str().substr(0, length) + "_";
+std::string detailPath(const KestContentInfo& record) {
+    return KestCommon::getSharedResourcePath(record.appid) + record.path;
 }
 
 }  // namespace
@@ -109,14 +106,23 @@ bool KestContentMgr::__loadMainMenu() {
     }
     const xmlNode* menus = document.findSection("menus");
     for (xmlNode* menu = menus ? menus->children : nullptr; menu; menu = menu->next) {
-        if (KestXmlDocument::isElement(menu, "menu")) {
-            __addMenu(menu);
+        if (!KestXmlDocument::isElement(menu, "menu")) {
+            continue;
+        }
+        const KestContentInfo record = __readMenu(menu);
+        if (!record.isAvailable) {
+            continue;
+        }
+        if (access(detailPath(record).c_str(), F_OK) == 0) {
+            contentsList.push_back(record);
+        } else {
+            KEST_WARN("__loadMainMenu failed : %s", record.appid.c_str());
         }
     }
     return true;
 }
 
-void KestContentMgr::__addMenu(xmlNode* menu) {
+KestContentInfo KestContentMgr::__readMenu(const xmlNode* menu) {
     KestContentInfo record;
     for (xmlNode* node = menu->children; node; node = node->next) {
         const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
@@ -128,21 +134,13 @@ void KestContentMgr::__addMenu(xmlNode* menu) {
             record.isAvailable = text != "NOK" && text.find(KestCommon::getRegion()) != std::string::npos;
         }
     }
-    if (!record.isAvailable) {
-        return;
-    }
-    const std::string detailPath = KestCommon::getSharedResourcePath(record.appid) + record.path;
-    if (access(detailPath.c_str(), F_OK) != 0) {
-        KEST_WARN("__loadMainMenu failed : %s", record.appid.c_str());
-        return;
-    }
-    contentsList.push_back(record);
+    return record;
 }
 
 bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
     KEST_BEGIN();
     __loadStringResource(record);
-    const std::string path = KestCommon::getSharedResourcePath(record.appid) + record.path;
+    const std::string path = detailPath(record);
     const int accessible = access(path.c_str(), F_OK);
     if (accessible != 0) {
         KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
@@ -163,7 +161,16 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
             continue;
         }
         for (xmlNode* node = item->children; node; node = node->next) {
-            __readDetail(node, record);
+            if (!KestXmlDocument::hasName(node, "contents")) {
+                __readDetail(node, record);
+                continue;
+            }
+            const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
+            const bool oldStyle = KestMarkup::find(text, record.titleId, 0) != std::string::npos;
+            if (oldStyle) {
+                KEST_INFO("Old xml style, Need to manipulate");
+            }
+            __setContents(record, text, oldStyle ? KestMarkup::cleanOldContents(text) : text);
         }
     }
     __saveToPreference(record);
@@ -192,13 +199,12 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
         record.launchParamKey = text;
     } else if (KestXmlDocument::hasName(node, "launchparamvalue")) {
         record.launchParamValue = text;
-    } else if (KestXmlDocument::hasName(node, "contents")) {
-        __loadContents(record, text);
     } else if (KestXmlDocument::hasName(node, "attach")) {
         const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
         if (content && id) {
             const std::string fragment = __convertHrefPath(record.appid, text);
-            record.textContents = __replaceString(record.textContents, KestXmlDocument::str(id), fragment, true);
+            record.textContents =
+                KestMarkup::replaceString(record.textContents, KestXmlDocument::str(id), fragment, true);
         }
     }
 }
@@ -213,41 +219,21 @@ std::string KestContentMgr::__translateById(xmlNode* node, const std::string& do
     return __getString(usedId, domain);
 }
 
-void KestContentMgr::__loadContents(KestContentInfo& record, const std::string& text) {
-    std::string contents = text;
-    if (contents.find(record.titleId) != std::string::npos) {
-        KEST_INFO("Old xml style, Need to manipulate");
-        contents = __cleanOldContents(contents);
-    }
-    const std::string translated = __translateContents(record.textdomain, contents);
+void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
+    const std::string translated = __translateContents(record.textdomain, cleaned);
     const std::string converted = __convertHrefPath(record.appid, translated);
     record.textContents = converted.empty() ? text : converted;
 }
 
-std::string KestContentMgr::__cleanOldContents(const std::string& contents) {
-    const std::string icon = __extractString(contents, "<item", "</item>", true);
-    if (icon.empty()) {
-        return contents;
-    }
-    std::string cleaned = __replaceString(contents, icon, "", true);
-    const std::string title = __extractString(cleaned, "<text", "</text>", true);
-    if (title.empty()) {
-        return cleaned;
-    }
-    cleaned = __replaceString(cleaned, title, "", true);
-    cleaned = __replaceString(cleaned, "<br/>", "", false);
-    return __replaceString(cleaned, "<br>", "", false);
-}
-
 std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
     // The directory begins with a slash itself; the text engine expects both.
-    return __replaceString(text, "href=file:", "href=file:/" + KestCommon::getSharedResourcePath(appid), false);
+    return KestMarkup::replaceString(text, "href=file:", "href=file:/" + KestCommon::getSharedResourcePath(appid),
+                                     false);
 }
 
 void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
     KEST_BEGIN();
-    const std::string detailPath = KestCommon::getSharedResourcePath(record.appid) + record.path;
-    const std::string path = __replaceString(detailPath, ".xml", "-string.xml", true);
+    const std::string path = KestMarkup::replaceString(detailPath(record), ".xml", "-string.xml", true);
     if (access(path.c_str(), F_OK) != 0) {
         return;
     }
@@ -292,9 +278,22 @@ bool KestContentMgr::__isStringAvailable(const std::string& id, const std::strin
     if (hasTranslation(domain.c_str(), id) || hasTranslation(ownDomain, id) || hasTranslation(systemDomain, id)) {
         return true;
     }
+    return __findInStringTable(id) != nullptr;
+}
+
+const std::string* KestContentMgr::__findInStringTable(const std::string& id) const {
     const KestPlatformString language(vconf_get_str(languageKey));
-    return language && (stringTable.count(languagePrefix(language, 5) + id) > 0 ||
-                        stringTable.count(languagePrefix(language, 2) + id) > 0);
+    if (!language) {
+        return nullptr;
+    }
+    // The display language names a country first ("ko_KR"), then only a language ("ko").
+    for (const size_t length : {5U, 2U}) {
+        const auto entry = stringTable.find(language.str().substr(0, length) + "_" + id);
+        if (entry != stringTable.end()) {
+            return &entry->second;
+        }
+    }
+    return nullptr;
 }
 
 std::string KestContentMgr::__getString(const std::string& id, const std::string& domain) {
@@ -309,66 +308,26 @@ std::string KestContentMgr::__getString(const std::string& id, const std::string
     if (hasTranslation(systemDomain, id)) {
         return dgettext(systemDomain, id.c_str());
     }
-    const KestPlatformString language(vconf_get_str(languageKey));
-    if (!language) {
-        return id;
-    }
-    auto entry = stringTable.find(languagePrefix(language, 5) + id);
-    if (entry == stringTable.end()) {
-        entry = stringTable.find(languagePrefix(language, 2) + id);
-    }
-    return entry == stringTable.end() ? id : entry->second;
+    const std::string* value = __findInStringTable(id);
+    return value ? *value : id;
 }
 
-std::string KestContentMgr::__translateContents(const std::string& domain, std::string contents) {
-    const std::string lineBreak = "<font_size=16><br/></>";
-    for (int replacements = 0;; ++replacements) {
-        const std::string tag = __extractString(contents, "<text", "</text>", true);
-        if (tag.empty()) {
-            return contents;
-        }
-        if (replacements == mostReplacements || contents.size() > longestContents) {
-            KEST_INFO("xml contents error: text id string part");
-            return contents;
-        }
-        const std::string id = __extractString(tag, "id=\"", "\">", false);
+std::string KestContentMgr::__translateContents(const std::string& domain, const std::string& contents) {
+    KestTextTags tags(contents);
+    for (std::string tag = tags.first(); !tag.empty(); tag = tags.first()) {
+        const std::string id = KestMarkup::extractString(tag, "id=\"", "\">", false);
         if (id.empty()) {
             KEST_INFO("xml contents error: text id string part");
-            return __extractString(tag, ">", "<", false);
+            return KestMarkup::extractString(tag, ">", "<", false);
         }
-        std::string value = __getString(id, domain);
-        value = __replaceString(value, "\n", lineBreak, false);
-        value = __replaceString(value, "\\n", lineBreak, false);
-        value = __replaceString(value, "&", "&amp;", false);
-        contents = __replaceString(contents, tag, value, false);
+        const std::string value = __getString(id, domain);
+        // Markup only makes it longer.
+        if (value.size() > KestTextTags::longestContents || !tags.replaceFirst(KestMarkup::fromTranslation(value))) {
+            KEST_INFO("xml contents error: text id string part");
+            break;
+        }
     }
-}
-
-std::string KestContentMgr::__replaceString(const std::string& text, const std::string& from, const std::string& to,
-                                            bool firstOnly) {
-    std::string result;
-    size_t copied = 0;
-    size_t found = text.find(from);
-    while (found != std::string::npos) {
-        result.append(text, copied, found - copied).append(to);
-        copied = found + from.size();
-        found = firstOnly || from.empty() ? std::string::npos : text.find(from, copied);
-    }
-    return result.append(text, copied, std::string::npos);
-}
-
-std::string KestContentMgr::__extractString(const std::string& text, const std::string& start, const std::string& end,
-                                            bool inclusive) {
-    const size_t found = text.find(start);
-    if (found == std::string::npos) {
-        return "";
-    }
-    const size_t from = inclusive ? found : found + start.size();
-    const size_t last = text.find(end, from);
-    if (last == std::string::npos) {
-        return "";
-    }
-    return text.substr(from, last - from + (inclusive ? end.size() : 0));
+    return tags.contents();
 }
 
 bool KestContentMgr::__checkCacheAvailable() {

@@ -8,8 +8,8 @@ namespace {
 
 const int recoverFromErrors = 1;
 
-/// More text than any element of a catalogue has; past it an element counts as empty.
-const size_t longestText = 16 * 1024 * 1024;
+/// More text than the entities of any file of a catalogue stand for.
+const size_t mostReferredText = 16 * 1024 * 1024;
 
 void freeText(xmlChar* text) {
     xmlFree(text);
@@ -20,54 +20,64 @@ bool isRegularFile(const std::string& path) {
     return stat(path.c_str(), &status) == 0 && S_ISREG(status.st_mode);
 }
 
-/// How long the text of a node becomes when the entities that the file declares are put in. A few kilobytes of
-/// nested declarations can stand for gigabytes, which the parser does not notice while it only refers to them.
-class ExpandedLength {
+/// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand
+/// for gigabytes, which the parser does not notice while it only refers to them.
+class ReferredText {
 public:
-    size_t of(const xmlNode* node) {
+    size_t lengthIn(const xmlDoc* document) { return lengthOf(xmlDocGetRootElement(document), false); }
+
+private:
+    /// Of a node and those after it, with the text between the references or without it.
+    size_t lengthOf(const xmlNode* first, bool withPlainText) {
         size_t length = 0;
-        for (const xmlNode* child = node->children; child && length <= longestText; child = child->next) {
-            length += ofSingle(child);
+        for (const xmlNode* node = first; node && length <= mostReferredText; node = node->next) {
+            if (node->type == XML_ENTITY_REF_NODE) {
+                length += lengthOf(xmlGetDocEntity(node->doc, node->name));
+            } else if (node->type == XML_ELEMENT_NODE) {
+                for (const xmlAttr* attribute = node->properties; attribute; attribute = attribute->next) {
+                    length += lengthOf(attribute->children, withPlainText);
+                }
+                length += lengthOf(node->children, withPlainText);
+            } else if (withPlainText && node->content) {
+                length += static_cast<size_t>(xmlStrlen(node->content));
+            }
         }
         return length;
     }
 
-private:
-    size_t ofSingle(const xmlNode* node) {
-        switch (node->type) {
-        case XML_TEXT_NODE:
-        case XML_CDATA_SECTION_NODE:
-            return node->content ? static_cast<size_t>(xmlStrlen(node->content)) : 0;
-        case XML_ENTITY_REF_NODE:
-            return ofEntity(xmlGetDocEntity(node->doc, node->name));
-        case XML_ELEMENT_NODE:
-            return of(node);
-        default:
-            return 0;
-        }
-    }
-
-    size_t ofEntity(const xmlEntity* entity) {
+    size_t lengthOf(const xmlEntity* entity) {
         if (!entity) {
             return 0;
         }
-        const auto known = entities_.find(entity);
-        if (known != entities_.end()) {
+        const auto known = lengths_.find(entity);
+        if (known != lengths_.end()) {
             return known->second;
         }
         // Stands until the real length is known, so that an entity that holds itself ends the search.
-        entities_[entity] = longestText + 1;
-        const size_t length = of(reinterpret_cast<const xmlNode*>(entity));
-        entities_[entity] = length;
+        lengths_[entity] = mostReferredText + 1;
+        const size_t length = lengthOf(entity->children, true);
+        lengths_[entity] = length;
         return length;
     }
 
-    std::map<const xmlEntity*, size_t> entities_;
+    std::map<const xmlEntity*, size_t> lengths_;
 };
 
-bool isTooLong(const xmlNode* node) {
-    const bool declaresEntities = node->doc && node->doc->intSubset && node->doc->intSubset->entities;
-    return declaresEntities && ExpandedLength().of(node) > longestText;
+/// From a node and those after it.
+void removeReferences(xmlNode* first) {
+    for (xmlNode* node = first; node;) {
+        xmlNode* next = node->next;
+        if (node->type == XML_ENTITY_REF_NODE) {
+            xmlUnlinkNode(node);
+            xmlFreeNode(node);
+        } else if (node->type == XML_ELEMENT_NODE) {
+            for (xmlAttr* attribute = node->properties; attribute; attribute = attribute->next) {
+                removeReferences(attribute->children);
+            }
+            removeReferences(node->children);
+        }
+        node = next;
+    }
 }
 
 }  // namespace
@@ -77,7 +87,10 @@ KestXmlDocument::Result KestXmlDocument::read(const std::string& path) {
     if (!document_) {
         return Result::NotRead;
     }
-    const xmlNode* root = xmlDocGetRootElement(document_.get());
+    xmlNode* root = xmlDocGetRootElement(document_.get());
+    if (ReferredText().lengthIn(document_.get()) > mostReferredText) {
+        removeReferences(root);
+    }
     return root && root->children ? Result::Ok : Result::Empty;
 }
 
@@ -98,11 +111,9 @@ bool KestXmlDocument::hasName(const xmlNode* node, const char* name) {
 }
 
 KestXmlDocument::Text KestXmlDocument::content(xmlNode* node) {
-    return Text(isTooLong(node) ? nullptr : xmlNodeGetContent(node), freeText);
+    return Text(xmlNodeGetContent(node), freeText);
 }
 
 KestXmlDocument::Text KestXmlDocument::attribute(xmlNode* node, const char* name) {
-    const xmlAttr* found = xmlHasProp(node, reinterpret_cast<const xmlChar*>(name));
-    const bool usable = found && !isTooLong(reinterpret_cast<const xmlNode*>(found));
-    return Text(usable ? xmlGetProp(node, found->name) : nullptr, freeText);
+    return Text(xmlGetProp(node, reinterpret_cast<const xmlChar*>(name)), freeText);
 }
