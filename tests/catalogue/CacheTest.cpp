@@ -1,0 +1,285 @@
+#include "CatalogueTest.h"
+
+#include <app_preference.h>
+
+using namespace manager_log;
+using kest_files::contents;
+using kest_files::Menu;
+using testing::Contains;
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::Not;
+using testing::Pair;
+
+namespace {
+
+std::vector<std::pair<std::string, std::string>> written;
+std::vector<std::string> asked;
+
+}  // namespace
+
+extern "C" {
+int __real_preference_set_string(const char* key, const char* value);
+int __wrap_preference_set_string(const char* key, const char* value);
+int __real_preference_get_string(const char* key, char** value);
+int __wrap_preference_get_string(const char* key, char** value);
+}
+
+int __wrap_preference_set_string(const char* key, const char* value) {
+    written.emplace_back(key, value);
+    return __real_preference_set_string(key, value);
+}
+
+int __wrap_preference_get_string(const char* key, char** value) {
+    asked.emplace_back(key);
+    return __real_preference_get_string(key, value);
+}
+
+class Cache : public CatalogueTest {
+protected:
+    /// A cache of the catalogue as the device is now, of one tip.
+    void fill() {
+        loadTip("<title>Cached</title>");
+        written.clear();
+        asked.clear();
+    }
+    /// What the next start of the application loads.
+    std::vector<KestContentInfo> loadAtNextStart() { return load(false); }
+    /// A load from the files leaves this trace, one from the cache does not.
+    bool loadedFromFiles() const { return testing::Value(log(), Contains(begin("__loadDetailMenu"))); }
+};
+
+TEST_F(Cache, IsWrittenFieldByFieldAfterEachTip) {
+    addApplication("com.example.clock");
+    writeMenus({{"contents/sub/clock.xml", "com.example.clock"}});
+    writeDetail("<textdomain>tips</textdomain><title>Title</title><appname>Clock</appname><image>a.png</image>"
+                "<launchappid>com.example.alarm</launchappid><launchparamkey>key</launchparamkey>"
+                "<launchparamvalue>value</launchparamvalue>" +
+                    contents("Text"),
+                "contents/sub/clock.xml", "com.example.clock");
+    written.clear();
+    load();
+    const std::string base = "contents_sub_clock.xml";
+    const std::string folder = resources("com.example.clock").string() + "/";
+    EXPECT_THAT(written, ElementsAre(Pair("KestPackageVersion", ""), Pair("KestCurrentLanguage", "en_US.UTF-8"),
+                                     Pair(base + "_textdomain", "tips"), Pair(base + "_menuTitle", "Title"),
+                                     Pair(base + "_textContents", "Text"), Pair(base + "_imagePath", folder + "a.png"),
+                                     Pair(base + "_iconPath", device()->packages().find("com.example.clock")->icon),
+                                     Pair(base + "_appName", "Clock"), Pair(base + "_launchAppid", "com.example.alarm"),
+                                     Pair(base + "_launchParamKey", "key"), Pair(base + "_launchParamValue", "value"),
+                                     Pair("KestPackageVersion", "1.0.0")));
+}
+
+TEST_F(Cache, HoldsEmptyFieldsToo) {
+    loadTip("<title>Title</title>");
+    EXPECT_EQ(preference("contents_tip.xml_appName"), "");
+    EXPECT_EQ(preference("contents_tip.xml_launchParamValue"), "");
+    EXPECT_EQ(preference("contents_tip.xml_textContents"), "No Contents");
+}
+
+TEST_F(Cache, HoldsNeitherPathNorApplicationNorTitleId) {
+    loadTip("<title id=\"IDS_OWN\">x</title>");
+    for (const char* field : {"_path", "_appid", "_isAvailable", "_titleId"})
+        EXPECT_EQ(preference(std::string("contents_tip.xml") + field), std::nullopt) << field;
+}
+
+TEST_F(Cache, IsNotWrittenForABrokenTip) {
+    writeMenus({{}});
+    support::writeFile(resources() / tipPath, "");
+    load();
+    EXPECT_EQ(preference("contents_tip.xml_menuTitle"), std::nullopt);
+    EXPECT_EQ(preference("KestPackageVersion"), "1.0.0");
+}
+
+TEST_F(Cache, ServesTheNextStart) {
+    fill();
+    const auto records = loadAtNextStart();
+    EXPECT_TRUE(result());
+    EXPECT_THAT(titles(records), ElementsAre("Cached"));
+    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"), hit("__getFromPreference")));
+}
+
+TEST_F(Cache, GivesBackItsNineFields) {
+    addApplication("com.example.clock");
+    writeMenus({{"contents/clock.xml", "com.example.clock"}});
+    writeDetail("<textdomain>tips</textdomain><title>Title</title><appname>Clock</appname><image>a.png</image>"
+                "<launchappid>com.example.alarm</launchappid><launchparamkey>key</launchparamkey>"
+                "<launchparamvalue>value</launchparamvalue>" +
+                    contents("Text"),
+                "contents/clock.xml", "com.example.clock");
+    const KestContentInfo full = load().at(0);
+    const KestContentInfo cached = loadAtNextStart().at(0);
+    ASSERT_FALSE(loadedFromFiles());
+    EXPECT_EQ(cached.path, full.path);
+    EXPECT_EQ(cached.appid, full.appid);
+    EXPECT_EQ(cached.isAvailable, full.isAvailable);
+    EXPECT_EQ(cached.menuTitle, "Title");
+    EXPECT_EQ(cached.textContents, "Text");
+    EXPECT_EQ(cached.imagePath, full.imagePath);
+    EXPECT_EQ(cached.textdomain, "tips");
+    EXPECT_EQ(cached.iconPath, full.iconPath);
+    EXPECT_EQ(cached.appName, "Clock");
+    EXPECT_EQ(cached.launchAppid, "com.example.alarm");
+    EXPECT_EQ(cached.launchParamKey, "key");
+    EXPECT_EQ(cached.launchParamValue, "value");
+}
+
+TEST_F(Cache, DoesNotKeepTheTitlesId) {
+    EXPECT_EQ(loadTip("<title id=\"IDS_OWN\">x</title>").titleId, "IDS_OWN");
+    EXPECT_EQ(loadAtNextStart().at(0).titleId, "");
+}
+
+TEST_F(Cache, IsReadFieldByFieldInTheSameOrder) {
+    fill();
+    loadAtNextStart();
+    const std::string base = "contents_tip.xml";
+    EXPECT_THAT(asked,
+                ElementsAre("KestCurrentLanguage", "KestPackageVersion", base + "_textdomain", base + "_menuTitle",
+                            base + "_textContents", base + "_imagePath", base + "_iconPath", base + "_appName",
+                            base + "_launchAppid", base + "_launchParamKey", base + "_launchParamValue"));
+    EXPECT_THAT(written, IsEmpty());
+}
+
+TEST_F(Cache, NeedsNoDetailOrStringFileToBeSound) {
+    fill();
+    support::writeFile(resources() / tipPath, "broken");
+    support::writeFile(resources() / "contents/tip-string.xml", "broken");
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Cached"));
+    EXPECT_THAT(errors(), IsEmpty());
+}
+
+TEST_F(Cache, LeavesAFieldEmptyThatItHoldsEmpty) {
+    fill();
+    setPreference("contents_tip.xml_menuTitle", "");
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre(""));
+    EXPECT_FALSE(loadedFromFiles());
+}
+
+TEST_F(Cache, LeavesAMenuBlankThatItHasNeverSeen) {
+    fill();
+    writeDetail("<title>New</title>", "contents/new.xml");
+    writeMenus({{}, {"contents/new.xml"}});
+    const auto records = loadAtNextStart();
+    ASSERT_EQ(records.size(), 2U);
+    EXPECT_EQ(records[1].path, "contents/new.xml");
+    EXPECT_EQ(records[1].menuTitle, "");
+    EXPECT_EQ(records[1].textContents, "");
+    EXPECT_FALSE(loadedFromFiles());
+}
+
+TEST_F(Cache, IsSharedByMenusOfTheSamePath) {
+    addApplication("com.example.clock");
+    writeMenus({{tipPath, kest}, {tipPath, "com.example.clock"}});
+    writeDetail("<title>Of Kest</title>");
+    writeDetail("<title>Of the clock</title>", tipPath, "com.example.clock");
+    EXPECT_THAT(titles(load()), ElementsAre("Of Kest", "Of the clock"));
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Of the clock", "Of the clock"));
+}
+
+TEST_F(Cache, IsSharedByPathsThatDifferInSlashesOnly) {
+    writeMenus({{"contents/a/b.xml"}, {"contents/a_b.xml"}});
+    writeDetail("<title>Slash</title>", "contents/a/b.xml");
+    writeDetail("<title>Underscore</title>", "contents/a_b.xml");
+    load();
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Underscore", "Underscore"));
+}
+
+TEST_F(Cache, AsksForTheIconAfresh) {
+    addApplication("com.example.clock");
+    writeMenus({{tipPath, "com.example.clock"}});
+    writeDetail("<title>Clock</title>", tipPath, "com.example.clock");
+    load();
+    setPreference("contents_tip.xml_iconPath", "/old/icon.png");
+    EXPECT_EQ(loadAtNextStart().at(0).iconPath, device()->packages().find("com.example.clock")->icon);
+    ASSERT_FALSE(loadedFromFiles());
+}
+
+TEST_F(Cache, IsNotUsedWhenALoadIsForced) {
+    fill();
+    writeDetail("<title>Changed</title>");
+    EXPECT_THAT(titles(load(true)), ElementsAre("Changed"));
+    EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Language changed"))));
+    EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Version changed!!"))));
+}
+
+TEST_F(Cache, IsInvalidWithoutALineWhenItHasNoLanguage) {
+    writeTip("<title>A</title>");
+    device()->preferences().clear(kest);
+    loadAtNextStart();
+    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"), begin("__loadDetailMenu"),
+                                   begin("__loadStringResource"), hit("__saveToPreference")));
+}
+
+TEST_F(Cache, IsInvalidForAnotherLanguage) {
+    fill();
+    setLanguage("ko_KR.UTF-8");
+    loadAtNextStart();
+    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
+                                   info("__checkCacheAvailable", "Language changed"), begin("__loadDetailMenu"),
+                                   begin("__loadStringResource"), hit("__saveToPreference")));
+    EXPECT_EQ(preference("KestCurrentLanguage"), "ko_KR.UTF-8");
+}
+
+TEST_F(Cache, ComparesLanguagesExactly) {
+    fill();
+    setLanguage("en_US");
+    loadAtNextStart();
+    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
+    EXPECT_TRUE(loadedFromFiles());
+}
+
+TEST_F(Cache, IsInvalidWhenTheDeviceNamesNoLanguage) {
+    fill();
+    device()->settings().remove(device::keys::language);
+    loadAtNextStart();
+    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
+    EXPECT_TRUE(loadedFromFiles());
+}
+
+TEST_F(Cache, IsInvalidForAnotherVersion) {
+    fill();
+    upgradeTo("1.0.1");
+    loadAtNextStart();
+    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
+                                   info("__checkCacheAvailable", "Version changed!!"), begin("__loadDetailMenu"),
+                                   begin("__loadStringResource"), hit("__saveToPreference")));
+    EXPECT_EQ(preference("KestPackageVersion"), "1.0.1");
+}
+
+TEST_F(Cache, IsInvalidAfterALoadThatWasCutShort) {
+    fill();
+    setPreference("KestPackageVersion", "");
+    loadAtNextStart();
+    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Version changed!!")));
+    EXPECT_TRUE(loadedFromFiles());
+    EXPECT_EQ(preference("KestPackageVersion"), "1.0.0");
+}
+
+TEST_F(Cache, IsValidForAnEmptyVersionOfAPackageWithoutOne) {
+    upgradeTo("");
+    fill();
+    ASSERT_EQ(preference("KestPackageVersion"), "");
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Cached"));
+    EXPECT_FALSE(loadedFromFiles());
+}
+
+TEST_F(Cache, IsValidWhenItsVersionCannotBeRead) {
+    fill();
+    const auto all = device()->preferences().all(kest);
+    device()->preferences().clear(kest);
+    for (const auto& [key, value] : all)
+        if (key != "KestPackageVersion")
+            setPreference(key, value);
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Cached"));
+    EXPECT_FALSE(loadedFromFiles());
+}
+
+TEST_F(Cache, FollowsTheRegionOfTheMainMenuFile) {
+    writeDetail("<title>A</title>", "contents/a.xml");
+    writeDetail("<title>B</title>", "contents/b.xml");
+    writeMenus({{"contents/a.xml"}, {"contents/b.xml", kest, "Global,India"}});
+    EXPECT_THAT(titles(load()), ElementsAre("A", "B"));
+    setCountry("IN");
+    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("B"));
+    EXPECT_FALSE(loadedFromFiles());
+}

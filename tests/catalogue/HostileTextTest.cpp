@@ -1,0 +1,168 @@
+#include "HostileTest.h"
+
+using namespace manager_log;
+using kest_files::cdata;
+using kest_files::contents;
+using kest_files::String;
+using kest_files::textTag;
+using testing::Contains;
+using testing::Not;
+
+/// Contents and translations that would keep the translator busy for ever.
+class HostileText : public HostileTest {
+protected:
+    static constexpr std::size_t megabyte = 1024 * 1024;
+
+    bool wasCutShort() const {
+        return testing::Value(log(), Contains(info("__translateContents", "xml contents error: text id string part")));
+    }
+    static std::string numbered(std::size_t number) {
+        std::string digits = std::to_string(number);
+        return textTag("IDS_" + std::string(7 - digits.size(), '0') + digits);
+    }
+    /// What tags(count) becomes when nothing knows the ids.
+    static std::string translated(std::size_t count) {
+        std::string all;
+        for (std::size_t i = 0; i < count; ++i)
+            all += numbered(i).substr(sizeof("<text id=\"") - 1, sizeof("IDS_0000000") - 1);
+        return all;
+    }
+    static std::string tags(std::size_t count) {
+        std::string all;
+        for (std::size_t i = 0; i < count; ++i)
+            all += numbered(i);
+        return all;
+    }
+};
+
+TEST_F(HostileText, TranslationMayBringItsOwnTagBack) {
+    writeStrings({{"en", "IDS_A", textTag("IDS_A")}});
+    EXPECT_EQ(loadContents(textTag("IDS_A")), textTag("IDS_A"));
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, TranslationMayBringItsOwnTagBackAndGrow) {
+    writeStrings({{"en", "IDS_A", textTag("IDS_A") + "x"}});
+    const std::string text = loadContents(textTag("IDS_A"));
+    EXPECT_EQ(text, textTag("IDS_A") + std::string(10000, 'x')) << "after 10,000 replacements it stays as it stands";
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, TranslationsMayBringEachOtherBack) {
+    writeStrings({{"en", "IDS_A", textTag("IDS_B")}, {"en", "IDS_B", textTag("IDS_A")}});
+    EXPECT_EQ(loadContents(textTag("IDS_A")), textTag("IDS_A"));
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, TranslationMayDoubleItself) {
+    writeStrings(
+        {{"en", "IDS_A", textTag("IDS_B") + textTag("IDS_B")}, {"en", "IDS_B", textTag("IDS_A") + textTag("IDS_A")}});
+    const std::string text = loadContents(textTag("IDS_A"));
+    EXPECT_LE(text.size(), megabyte);
+    EXPECT_GT(text.size(), megabyte / 4);
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, LongTranslationMayBringItselfBack) {
+    const std::string tag = "<text id=\"IDS_A\">" + std::string(900000, 'x') + "</text>";
+    writeStrings({{"en", "IDS_A", tag}});
+    EXPECT_EQ(loadContents(textTag("IDS_A")), tag);
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, LongTranslationsMayBringEachOtherBack) {
+    const auto tag = [](const std::string& id) {
+        return "<text id=\"" + id + "\">" + std::string(900000, 'x') + "</text>";
+    };
+    writeStrings({{"en", "IDS_A", tag("IDS_B")}, {"en", "IDS_B", tag("IDS_A")}});
+    EXPECT_THAT(loadContents(textTag("IDS_A")), testing::AnyOf(tag("IDS_A"), tag("IDS_B")));
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, LongTranslationMayBeUsedOften) {
+    writeStrings({{"en", "IDS_A", std::string(megabyte - 100, 'x')}});
+    const std::string text = repeated(textTag("IDS_A"), 25000);
+    EXPECT_EQ(loadContents(text), text) << "it would become 25 gigabytes";
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, TranslationMayBeAllLineBreaksOrAmpersands) {
+    for (const char* piece : {"\n", "\\n", "&"}) {
+        writeStrings({{"en", "IDS_A", repeated(piece, 9000000 / std::string(piece).size())}});
+        EXPECT_EQ(loadContents(textTag("IDS_A")), textTag("IDS_A"));
+        EXPECT_TRUE(wasCutShort());
+    }
+}
+
+TEST_F(HostileText, TranslationOfAMegabyteIsPutIn) {
+    const std::string value(megabyte - 2, 'x');
+    writeStrings({{"en", "IDS_A", value}});
+    EXPECT_EQ(loadContents("a" + textTag("IDS_A") + "b"), "a" + value + "b");
+    EXPECT_FALSE(wasCutShort());
+}
+
+TEST_F(HostileText, ContentsOfMoreThanAMegabyteStayAsTheyAre) {
+    const std::string text = std::string(megabyte, 'x') + textTag("IDS_OWN");
+    EXPECT_EQ(loadContents(text), text);
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, ContentsMayHaveTenThousandDifferentTags) {
+    EXPECT_TRUE(loadContents(tags(10000)) == translated(10000));
+    EXPECT_FALSE(wasCutShort());
+}
+
+TEST_F(HostileText, ContentsMayHaveMoreThanTenThousandDifferentTags) {
+    EXPECT_TRUE(loadContents(tags(24000)) == translated(10000) + tags(24000).substr(tags(10000).size()));
+    EXPECT_TRUE(wasCutShort());
+}
+
+TEST_F(HostileText, ContentsMayHaveAMillionTags) {
+    const std::string text = loadContents(repeated("<text id=\"IDS_OWN\">a</text>", 35000));
+    EXPECT_EQ(text, repeated("Own text", 35000));
+    EXPECT_FALSE(wasCutShort());
+    const std::string million = tags(1000000);
+    EXPECT_EQ(loadContents("<![CDATA[" + million.substr(0, 9000000)), "<![CDATA[" + million.substr(0, 9000000));
+}
+
+TEST_F(HostileText, ContentsMayBeFullOfBeginnings) {
+    const std::string rest = repeated("<", 600000);
+    const std::string text = loadContents(tags(10000) + rest);
+    EXPECT_TRUE(text == translated(10000) + rest);
+    EXPECT_FALSE(wasCutShort());
+}
+
+TEST_F(HostileText, ContentsMayBeFullOfTagsThatDoNotEnd) {
+    const std::string text = repeated("<text id=\"IDS_OWN\">", 50000);
+    EXPECT_EQ(loadContents(text), text);
+    EXPECT_EQ(loadContents(text + "</text>"), "Own text");
+}
+
+TEST_F(HostileText, ContentsMayBeFullOfEnds) {
+    const std::string text = repeated("</text>", 100000);
+    EXPECT_EQ(loadContents(text + tags(5000)).size(), text.size() + 5000 * 11);
+}
+
+TEST_F(HostileText, ContentsMayReferToAMillionFiles) {
+    const std::string text = loadContents(repeated("href=file:", 900000));
+    EXPECT_EQ(text, repeated("href=file:/" + resources().string() + "/", 900000));
+}
+
+TEST_F(HostileText, TitlesIdMayBeNearlyWhatTheContentsAreFullOf) {
+    const std::string id = std::string(500000, 'a') + "b";
+    writeStrings({{"en", id, "Title"}});
+    const std::string text(5000000, 'a');
+    EXPECT_EQ(loadTip("<title id=\"" + id + "\">x</title>" + contents(text)).textContents, text);
+}
+
+TEST_F(HostileText, AttachmentsIdMayBeNearlyWhatTheContentsAreFullOf) {
+    const std::string text(5000000, 'a');
+    EXPECT_EQ(loadTip(contents(text) + "<attach id=\"" + std::string(500000, 'a') + "b\">x</attach>").textContents,
+              text);
+}
+
+TEST_F(HostileText, AttachmentsMayBeTenThousand) {
+    EXPECT_EQ(loadTip(contents("A" + std::string(100000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 10000))
+                  .textContents.size(),
+              110001U);
+}

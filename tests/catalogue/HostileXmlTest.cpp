@@ -1,0 +1,161 @@
+#include "HostileTest.h"
+
+using namespace manager_log;
+using kest_files::cdata;
+using kest_files::contents;
+using kest_files::Menu;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+/// Entities: declared in a few bytes, they can stand for more than the machine has.
+class HostileXml : public HostileTest {
+protected:
+    void SetUp() override { testing::internal::CaptureStderr(); }
+    void TearDown() override { testing::internal::GetCapturedStderr(); }
+
+    static std::string file(const std::string& declarations, const std::string& item) {
+        return std::string(kest_files::xmlHead) + "<!DOCTYPE tip [\n" + declarations + "]>\n<tip>\n<items>\n<item>\n" +
+               item + "</item>\n</items>\n</tip>\n";
+    }
+    static std::string entity(const std::string& name, const std::string& value) {
+        return "<!ENTITY " + name + " \"" + value + "\">\n";
+    }
+    /// "&a9;" stands for ten to the ninth words.
+    static std::string billionLaughs() {
+        std::string declarations = entity("a0", "lol");
+        for (int i = 1; i < 10; ++i)
+            declarations += entity("a" + std::to_string(i), repeated("&a" + std::to_string(i - 1) + ";", 10));
+        return declarations;
+    }
+    KestContentInfo loadDetail(const std::string& text) {
+        writeMenus({{}});
+        support::writeFile(resources() / tipPath, text);
+        const auto records = load();
+        EXPECT_TRUE(result());
+        return records.at(0);
+    }
+    void writeStringFile(const std::string& text) { support::writeFile(resources() / "contents/tip-string.xml", text); }
+};
+
+TEST_F(HostileXml, EntityOfTheFilesOwnIsPutIn) {
+    EXPECT_EQ(loadDetail(file(entity("name", "Kest"), "<title>About &name; &amp; &#65;</title>")).menuTitle,
+              "About Kest & A");
+}
+
+TEST_F(HostileXml, EntityOfTheFilesOwnIsPutIntoAnAttribute) {
+    EXPECT_EQ(loadDetail(file(entity("id", "OWN"), "<title id=\"IDS_&id;\">x</title>")).menuTitle, "Own text");
+}
+
+TEST_F(HostileXml, EntityThatNobodyDeclaredIsLeftOut) {
+    EXPECT_EQ(loadDetail("<tip><items><item><title>a&nothing;b</title></item></items></tip>").menuTitle, "ab");
+}
+
+TEST_F(HostileXml, BillionLaughsBeforeTheItemsLeaveNoTitle) {
+    const std::string text = std::string(kest_files::xmlHead) + "<!DOCTYPE tip [\n" + billionLaughs() +
+                             "]>\n<tip>\n&a9;<items><item><title>Title</title></item></items></tip>";
+    const KestContentInfo record = loadDetail(text);
+    EXPECT_EQ(record.menuTitle, "No Title");
+    EXPECT_EQ(record.textContents, "No Contents");
+    EXPECT_THAT(errors(), IsEmpty());
+}
+
+TEST_F(HostileXml, BillionLaughsInATitleLeaveItEmpty) {
+    EXPECT_LE(loadDetail(file(billionLaughs(), "<title>&a9;</title>")).menuTitle.size(), 16U << 20);
+}
+
+TEST_F(HostileXml, BillionLaughsInContentsLeaveThemBounded) {
+    EXPECT_LE(loadDetail(file(billionLaughs(), "<contents>&a9;</contents>")).textContents.size(), 16U << 20);
+}
+
+TEST_F(HostileXml, BillionLaughsInAnAttributeLeaveTheText) {
+    EXPECT_EQ(loadDetail(file(billionLaughs(), "<title id=\"&a9;\">Title</title>")).menuTitle, "Title");
+    EXPECT_EQ(loadDetail(file(billionLaughs(), "<contents>text</contents><attach id=\"&a9;\">x</attach>")).textContents,
+              "xtext");
+}
+
+TEST_F(HostileXml, BillionLaughsInTheMainMenuLeaveItBounded) {
+    support::writeFile(mainMenuFile(), std::string(kest_files::xmlHead) + "<!DOCTYPE tips [" + billionLaughs() +
+                                           "]><tips><menus><menu><path>&a9;</path><appid>&a9;</appid>"
+                                           "<state>Global &a9;</state></menu></menus></tips>");
+    EXPECT_LE(load().size(), 1U);
+}
+
+TEST_F(HostileXml, BillionLaughsInTheStringsLeaveTheTip) {
+    writeStringFile(file(billionLaughs(), "<region>en</region><stringid>IDS_MINE</stringid><value>&a9;</value>"));
+    EXPECT_LE(loadTip("<title id=\"IDS_MINE\">untranslated</title>").menuTitle.size(), 16U << 20);
+}
+
+TEST_F(HostileXml, ManyReferencesToALongEntityAreLeftOut) {
+    const std::string declarations = entity("long", std::string(100000, 'a'));
+    EXPECT_EQ(loadDetail(file(declarations, "<title>a" + repeated("&long;", 10000) + "b</title>")).menuTitle, "ab");
+    EXPECT_EQ(loadDetail(file(declarations, "<title id=\"" + repeated("&long;", 10000) + "\">Title</title>")).menuTitle,
+              "Title");
+}
+
+TEST_F(HostileXml, ManyElementsOfALongEntityAreBoundedTogether) {
+    const std::string declarations = entity("long", std::string(1000000, 'a'));
+    std::string items;
+    for (int i = 0; i < 20000; ++i)
+        items +=
+            "<item><region>en</region><stringid>IDS_" + std::to_string(i) + "</stringid><value>&long;</value></item>";
+    writeStringFile(std::string(kest_files::xmlHead) + "<!DOCTYPE strings [" + declarations + "]><strings><items>" +
+                    items + "</items></strings>");
+    EXPECT_EQ(loadTip("<title id=\"IDS_7\">untranslated</title>").menuTitle, "");
+}
+
+TEST_F(HostileXml, ManyAttachmentsOfALongEntityAreBoundedTogether) {
+    EXPECT_EQ(loadDetail(file(entity("long", std::string(1000000, 'a')),
+                              "<contents>text</contents>" + repeated("<attach id=\"t\">t&long;</attach>", 20000)))
+                  .textContents,
+              "text");
+}
+
+TEST_F(HostileXml, ManyEntitiesAreMeasuredOnce) {
+    // Each stands for the one before it: measuring them anew for every title would never end.
+    std::string declarations = entity("e0", "x");
+    for (int i = 1; i < 10; ++i)
+        declarations += entity("e" + std::to_string(i), repeated("&e" + std::to_string(i - 1) + ";", 1));
+    EXPECT_EQ(loadDetail(file(declarations, repeated("<title>&e9;</title>", 50000))).menuTitle, "x");
+}
+
+TEST_F(HostileXml, EntityThatHoldsItselfEnds) {
+    EXPECT_EQ(loadDetail(file(entity("a", "&a;"), "<title>x&a;y</title>")).appName, "");
+    EXPECT_EQ(loadDetail(file(entity("a", "&b;") + entity("b", "&a;"), "<title>x&a;y</title>")).appName, "");
+    EXPECT_EQ(loadDetail(file(entity("a", "&a;"), "<title id=\"&a;\">Title</title>")).appName, "");
+}
+
+TEST_F(HostileXml, EntityThatHoldsElementsIsReadAsTheirText) {
+    EXPECT_EQ(loadDetail(file(entity("a", "<b>bold &amp;</b><c d='e'/> word"), "<title>&a;</title>")).menuTitle,
+              "bold & word");
+}
+
+TEST_F(HostileXml, ExternalFilesAreNeverOpened) {
+    makeFifo(resources() / "contents/pipe");
+    support::writeFile(resources() / "contents/secret", "secret");
+    for (const char* name : {"pipe", "secret", "/dev/zero", "http://127.0.0.1:9/x"}) {
+        const std::string target = name;
+        EXPECT_EQ(loadDetail(file("<!ENTITY x SYSTEM \"" + target + "\">", "<title>a&x;b</title>")).menuTitle, "ab");
+        EXPECT_EQ(loadDetail(file("<!ENTITY % x SYSTEM \"" + target + "\"> %x;", "<title>ab</title>")).menuTitle, "ab");
+        EXPECT_EQ(loadDetail("<!DOCTYPE tip SYSTEM \"" + target +
+                             "\"><tip><items><item><title>ab</title></item></items></tip>")
+                      .menuTitle,
+                  "ab");
+        EXPECT_EQ(
+            loadDetail("<tip xmlns:xi=\"http://www.w3.org/2001/XInclude\"><items><item><title>a<xi:include href=\"" +
+                       target + "\" parse=\"text\"/>b</title></item></items></tip>")
+                .menuTitle,
+            "ab");
+    }
+}
+
+TEST_F(HostileXml, MayHaveAMillionAttributesOrElements) {
+    std::string attributes;
+    for (int i = 0; i < 20000; ++i)
+        attributes += " a" + std::to_string(i) + "=\"x\"";
+    EXPECT_EQ(loadDetail("<tip><items><item><title" + attributes + ">Title</title></item></items></tip>").menuTitle,
+              "Title");
+    EXPECT_EQ(loadDetail("<tip>" + repeated("<x/>", 500000) + "<items>" + repeated("<x/>", 500000) + "<item>" +
+                         repeated("<x/>", 500000) + "<title>Title</title></item></items></tip>")
+                  .menuTitle,
+              "Title");
+}
