@@ -20,15 +20,21 @@ std::string at(const std::string& file, long line, const std::string& problem) {
 /// As the application looks a text up: shared texts first, then the tip's own by "ko_KR", then by "ko".
 std::optional<std::string> textFor(const Tip& tip, const std::string& language, const std::string& id,
                                    const SharedTexts& shared) {
-    if (const std::optional<std::string> text = shared(language, id))
+    if (std::optional<std::string> text = shared(language, id))
         return text;
+    const std::vector<String>& own = tip.strings.strings;
     for (const std::string& region : {language.substr(0, 5), language.substr(0, 2)}) {
-        for (auto string = tip.strings.strings.rbegin(); string != tip.strings.strings.rend(); ++string) {
-            if (string->region == region && string->id == id)
-                return string->value;
-        }
+        const auto last = std::find_if(
+            own.rbegin(), own.rend(), [&](const String& string) { return string.region == region && string.id == id; });
+        if (last != own.rend())
+            return last->value;
     }
     return std::nullopt;
+}
+
+/// One problem in one of the languages.
+std::string inLanguage(const std::string& file, long line, const std::string& problem, const std::string& language) {
+    return at(file, line, problem + " in " + language);
 }
 
 std::map<std::string, long> idsOf(const Tip& tip) {
@@ -70,7 +76,7 @@ Problems idsAreTranslated(const Tip& tip, const std::vector<std::string>& langua
     for (const auto& [id, line] : ids) {
         for (const std::string& language : languages) {
             if (!textFor(tip, language, id, shared))
-                problems.push_back(at(tip.detail.file, line, id + " has no text in " + language));
+                problems.push_back(inLanguage(tip.detail.file, line, id + " has no text", language));
         }
     }
     for (const String& string : tip.strings.strings) {
@@ -91,15 +97,15 @@ Problems translationsFitTheirPlace(const Tip& tip, const std::vector<std::string
         const auto translate = [&](const std::string& id) { return textFor(tip, language, id, shared).value_or(id); };
         for (const Line& id : {detail.titleId, detail.appNameId}) {
             if (translate(id.text).find_first_of("<&\n") != std::string::npos)
-                problems.push_back(at(detail.file, id.number, id.text + " is no plain line in " + language));
+                problems.push_back(inLanguage(detail.file, id.number, id.text + " is no plain line", language));
         }
         const std::string contents = translateContents(detail.contents.text, translate);
         for (const std::string& problem : markupProblems(contents))
-            problems.push_back(at(detail.file, detail.contents.number, problem + ", in " + language));
+            problems.push_back(inLanguage(detail.file, detail.contents.number, problem, language));
         for (const Attachment& attachment : detail.attachments) {
             if (count(contents, attachment.id) != 1)
-                problems.push_back(at(detail.file, attachment.markup.number,
-                                      attachment.id + " does not stand once in the contents, in " + language));
+                problems.push_back(inLanguage(detail.file, attachment.markup.number,
+                                              attachment.id + " does not stand once in the contents", language));
         }
     }
     for (const Attachment& attachment : detail.attachments) {

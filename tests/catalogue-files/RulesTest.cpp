@@ -98,7 +98,7 @@ TEST(Rules, RefuseATranslationThatLeavesATagOpen) {
     Tip tip = goodTip();
     tip.strings.strings[4].value = "<b>길게 누르세요.";
     EXPECT_THAT(translationsFitTheirPlace(tip, languages, clockOnly),
-                ElementsAre("faces.xml:8: <b> is not closed, in ko_KR"));
+                ElementsAre("faces.xml:8: <b> is not closed in ko_KR"));
 }
 
 TEST(Rules, RefuseATranslationThatLosesAnAttachment) {
@@ -106,7 +106,7 @@ TEST(Rules, RefuseATranslationThatLosesAnAttachment) {
     tip.detail.attachments = {{"PICTURE", {"<item href=file:contents/a.png></item>", 9}}};
     tip.strings.strings[1].value = "Tap PICTURE.";
     EXPECT_THAT(translationsFitTheirPlace(tip, languages, clockOnly),
-                ElementsAre("faces.xml:9: PICTURE does not stand once in the contents, in ko_KR"));
+                ElementsAre("faces.xml:9: PICTURE does not stand once in the contents in ko_KR"));
 }
 
 TEST(Rules, RefuseAnAttachmentThatLeavesATagOpen) {

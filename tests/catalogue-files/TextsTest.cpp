@@ -49,33 +49,42 @@ std::set<std::string> idsIn(const fs::path& file) {
     return ids;
 }
 
-class Domain : public testing::TestWithParam<std::pair<const char*, const char*>> {};
+struct Translations {
+    std::string folder;
+    std::string domain;
+
+    fs::path in(const std::string& language) const {
+        return project / folder / language / "LC_MESSAGES" / (domain + ".po");
+    }
+};
+
+void PrintTo(const Translations& translations, std::ostream* stream) {
+    *stream << translations.domain;
+}
+
+class Domain : public testing::TestWithParam<Translations> {};
 
 TEST_P(Domain, HasEveryTextInEveryLanguage) {
-    const auto [folder, domain] = GetParam();
-    const auto fileOf = [&](const std::string& language) {
-        return project / folder / language / "LC_MESSAGES" / (std::string(domain) + ".po");
-    };
-    const std::set<std::string> ids = idsIn(fileOf("en_US"));
+    const std::set<std::string> ids = idsIn(GetParam().in("en_US"));
     EXPECT_FALSE(ids.empty());
     for (const std::string& language : languagesIn(DEVICE_TEXTS))
-        EXPECT_EQ(ids, idsIn(fileOf(language))) << language;
+        EXPECT_EQ(ids, idsIn(GetParam().in(language))) << language;
 }
 
 TEST_P(Domain, HasNoUnsafeFormat) {
-    const auto [folder, domain] = GetParam();
     for (const std::string& language : languagesIn(DEVICE_TEXTS)) {
         const support::TemporaryFolder copy;
         const fs::path file = copy.path() / "texts.po";
-        fs::copy(project / folder / language / "LC_MESSAGES" / (std::string(domain) + ".po"), file);
+        fs::copy(GetParam().in(language), file);
         const Outcome outcome = checkFormats(file);
         EXPECT_EQ(0, outcome.status) << language << ": " << outcome.output;
     }
 }
 
 INSTANTIATE_TEST_SUITE_P(Texts, Domain,
-                         testing::Values(std::pair("res/locale", "kest"), std::pair("platform/locale", "sys_string")),
-                         [](const auto& domain) { return domain.param.second; });
+                         testing::Values(Translations{"res/locale", "kest"},
+                                         Translations{"platform/locale", "sys_string"}),
+                         [](const auto& instance) { return instance.param.domain; });
 
 TEST(Texts, OfTheApplicationAndTheDeviceHaveTheSameLanguages) {
     EXPECT_THAT(languagesIn(DEVICE_TEXTS), ElementsAre("en_US", "ko_KR", "ru_RU"));
