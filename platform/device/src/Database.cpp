@@ -8,7 +8,6 @@
 #include "device/Keys.h"
 
 #include <fcntl.h>
-#include <sqlite3.h>
 #include <tuple>
 
 namespace device {
@@ -100,7 +99,7 @@ SQLite::Statement& Database::statement(const char* text) {
 void Database::fail(const SQLite::Exception& failure) {
     if (tellsOfDamage(failure))
         Descriptor(open(suspicion_.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
-    throw Error(lineFor(file_, failure, sql_ ? sqlite3_system_errno(sql_->getHandle()) : 0));
+    throw Error(lineFor(file_, failure));
 }
 
 }  // namespace device

@@ -1,8 +1,5 @@
 #include "DatabaseFailure.h"
 
-#include "Files.h"
-
-#include <cerrno>
 #include <sqlite3.h>
 
 namespace device {
@@ -12,26 +9,20 @@ int kindOf(const SQLite::Exception& failure) {
     return failure.getErrorCode() & 0xff;
 }
 
-bool tellsOfFullDisk(int kind, int systemError) {
-    return kind == SQLITE_FULL || systemError == ENOSPC || systemError == EDQUOT || systemError == EFBIG;
-}
-
 }  // namespace
 
 bool tellsOfDamage(const SQLite::Exception& failure) {
     return kindOf(failure) == SQLITE_CORRUPT || kindOf(failure) == SQLITE_NOTADB;
 }
 
-std::string lineFor(const std::filesystem::path& file, const SQLite::Exception& failure, int systemError) {
+std::string lineFor(const std::filesystem::path& file, const SQLite::Exception& failure) {
     const std::string name = file.string() + ": ";
-    const std::string reason =
-        std::string(failure.what()) + (systemError != 0 ? ", " + reasonOf(systemError) : std::string());
-    const int kind = kindOf(failure);
+    const std::string reason = failure.what();
     if (tellsOfDamage(failure))
         return name + "is damaged (" + reason + "); start the device anew, which sets the file aside";
-    if (tellsOfFullDisk(kind, systemError))
+    switch (kindOf(failure)) {
+    case SQLITE_FULL:
         return name + "the disk is full (" + reason + "); free some space and try again";
-    switch (kind) {
     case SQLITE_BUSY:
     case SQLITE_LOCKED:
         return name + "is held by another process (" + reason + "); end that process and try again";
@@ -42,7 +33,7 @@ std::string lineFor(const std::filesystem::path& file, const SQLite::Exception& 
     case SQLITE_CANTOPEN:
         return name + "cannot be opened (" + reason + "); make it and its folder readable and writable for this user";
     case SQLITE_IOERR:
-        return name + "cannot be read or written (" + reason + "); check the disk that it lies on";
+        return name + "cannot be read or written (" + reason + "); check that its disk is neither full nor broken";
     default:
         return name + "cannot be used (" + reason + ")";
     }

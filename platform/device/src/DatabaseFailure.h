@@ -11,7 +11,6 @@ namespace device {
 bool tellsOfDamage(const SQLite::Exception& failure);
 
 /// One line for people about a failure of the database in `file`: the file, what is wrong, what to do.
-/// `systemError` is the errno behind it, 0 when that is not known.
-std::string lineFor(const std::filesystem::path& file, const SQLite::Exception& failure, int systemError);
+std::string lineFor(const std::filesystem::path& file, const SQLite::Exception& failure);
 
 }  // namespace device

@@ -38,6 +38,13 @@ bool isReadOnly(SQLite::Database& sql) {
     return sqlite3_db_readonly(sql.getHandle(), "main") == 1;
 }
 
+/// SQLite takes a file that is shorter than the smallest page for an empty one.
+bool isCutShort(const std::filesystem::path& file) {
+    std::error_code error;
+    const std::uintmax_t size = std::filesystem::file_size(file, error);
+    return !error && size > 0 && size < 512;
+}
+
 std::string damageFound(SQLite::Database& sql, const std::filesystem::path& file, bool thorough) {
     const int version = sql.execAndGet("PRAGMA user_version").getInt();
     if (version > schemaVersion)
@@ -47,7 +54,10 @@ std::string damageFound(SQLite::Database& sql, const std::filesystem::path& file
     const int tables = sql.execAndGet("SELECT count(*) FROM sqlite_schema WHERE type = 'table' AND name IN "
                                       "('setting', 'preference', 'package', 'usage')")
                            .getInt();
-    if (!isFresh(sql) && (version != schemaVersion || tables != 4))
+    const bool fresh = version == 0 && isFresh(sql);
+    if (fresh && isCutShort(file))
+        return "it is cut short";
+    if (!fresh && (version != schemaVersion || tables != 4))
         return "it is no database of a device";
     if (isReadOnly(sql)) {
         if (access(file.c_str(), W_OK) == 0)

@@ -112,8 +112,7 @@ bool isFull(const Descriptor& file, std::size_t more) {
 }
 
 void echo(const std::string& line) {
-    static const bool terminal = isatty(STDERR_FILENO) == 1;
-    if (terminal)
+    if (isatty(STDERR_FILENO) == 1)
         writeWhole(STDERR_FILENO, line);
 }
 

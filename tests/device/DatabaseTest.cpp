@@ -1,0 +1,382 @@
+#include "device/Database.h"
+
+#include "device/Device.h"
+#include "device/Error.h"
+#include "device/Keys.h"
+#include "support/Message.h"
+#include "support/Process.h"
+#include "support/TemporaryDevice.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <random>
+#include <sys/file.h>
+#include <sys/resource.h>
+
+namespace {
+
+using device::Database;
+using device::Device;
+using support::messageOf;
+using support::Process;
+using support::readFile;
+using support::TemporaryDevice;
+using support::TemporaryFolder;
+using support::writeFile;
+using testing::ElementsAre;
+using testing::MatchesRegex;
+using testing::Pair;
+using testing::UnorderedElementsAre;
+
+Device::Options optionsFor(const std::filesystem::path& folder, Database::Check check = Database::Check::Quick) {
+    return {device::Folder(folder), {}, folder / "data", check};
+}
+
+std::vector<std::string> filesIn(const std::filesystem::path& folder) {
+    std::vector<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(folder))
+        names.push_back(entry.path().filename().string());
+    return names;
+}
+
+TEST(Database, OfAFreshDeviceHoldsItsFirstSettings) {
+    const TemporaryDevice device;
+    EXPECT_THAT(device->settings().all(),
+                ElementsAre(Pair("db/display/profile", "720x1280"), Pair("db/menu_widget/language", "en_US.UTF-8"),
+                            Pair("db/setting/theme", "light")));
+    EXPECT_EQ(device->settings().get(device::keys::country), std::nullopt);
+}
+
+TEST(Database, IsWrittenAheadAndCarriesTheVersionOfItsSchema) {
+    const TemporaryDevice device;
+    SQLite::Database& sql = device->database().sql();
+    EXPECT_EQ(sql.execAndGet("PRAGMA journal_mode").getString(), "wal");
+    EXPECT_EQ(sql.execAndGet("PRAGMA synchronous").getInt(), 1);
+    EXPECT_EQ(sql.execAndGet("PRAGMA busy_timeout").getInt(), 5000);
+    EXPECT_EQ(sql.execAndGet("PRAGMA user_version").getInt(), 1);
+}
+
+TEST(Database, IsMadeOnceWhenManyProcessesMakeIt) {
+    const TemporaryFolder there;
+    std::vector<Process> processes;
+    for (int number = 0; number < 8; ++number)
+        processes.push_back(Process::ofWork([&, number] {
+            Device device(optionsFor(there.path() / "device"));
+            device.preferences().set("com.example.app", std::to_string(number), "written");
+            return 0;
+        }));
+    for (Process& process : processes)
+        EXPECT_EQ(process.wait(), 0);
+    Device device(optionsFor(there.path() / "device", Database::Check::Full));
+    EXPECT_EQ(device.preferences().all("com.example.app").size(), 8U);
+    EXPECT_EQ(device.settings().all().size(), 3U);
+}
+
+TEST(Database, TakesTheWritesOfTwoProcessesAtOnce) {
+    const TemporaryDevice device;
+    const auto writer = [&](const std::string& name) {
+        return Process::ofWork([&, name] {
+            Device same(device.options());
+            for (int number = 0; number < 300; ++number)
+                same.preferences().set("com.example.app", name + std::to_string(number), std::string(500, 'x'));
+            return 0;
+        });
+    };
+    Process first = writer("first");
+    Process second = writer("second");
+    EXPECT_EQ(first.wait(), 0);
+    EXPECT_EQ(second.wait(), 0);
+    EXPECT_EQ(device->preferences().all("com.example.app").size(), 600U);
+}
+
+TEST(Database, IsSoundAfterAWriterIsKilledAtAnyMoment) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path() / "device", Database::Check::Full);
+    std::mt19937 random(4711);
+    std::uniform_int_distribution<int> microseconds(0, 20000);
+    for (int round = 0; round < 40; ++round) {
+        auto writer = Process::ofWork([&] {
+            Device device(options);
+            for (int number = 0;; ++number)
+                device.preferences().set("com.example.app", std::to_string(number % 200), std::string(2000, 'x'));
+            return 0;
+        });
+        // The moment is the point of this test: a real one, at random, while the writer runs.
+        usleep(static_cast<useconds_t>(microseconds(random)));
+        writer.end(SIGKILL);
+        Device device(options);
+        EXPECT_EQ(device.settings().all().size(), 3U);
+        for (const auto& [key, value] : device.preferences().all("com.example.app"))
+            ASSERT_EQ(value, std::string(2000, 'x')) << key;
+    }
+    for (const std::string& name : filesIn(there.path() / "device"))
+        EXPECT_EQ(name.find("damaged"), std::string::npos) << name;
+}
+
+/// One way of damaging a database file, and what SQLite says of it.
+struct Damage {
+    const char* name;
+    std::function<void(std::string&)> change;
+    Database::Check check;
+    const char* reason;
+};
+
+void PrintTo(const Damage& damage, std::ostream* stream) {
+    *stream << damage.name;
+}
+
+class DamagedDatabase : public testing::TestWithParam<Damage> {};
+
+TEST_P(DamagedDatabase, IsSetAsideAndReplacedByAFreshOne) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path() / "device", GetParam().check);
+    const std::string file = options.folder.database().string();
+    {
+        Device device(options);
+        for (int number = 0; number < 50; ++number)
+            device.preferences().set("com.example.app", std::to_string(number), std::string(2000, 'x'));
+    }
+    std::string damaged = readFile(file);
+    GetParam().change(damaged);
+    writeFile(file, damaged);
+
+    const std::string line = messageOf([&] { Device device(options); });
+    const std::string aside = file + "\\.damaged-[0-9]+T[0-9]+Z";
+    ASSERT_THAT(line, MatchesRegex(file + ": is damaged \\(" + GetParam().reason + "\\); it was renamed to " + aside +
+                                   " and the device begins with a fresh database; `sqlite3 " + aside +
+                                   " \\.recover` prints what can be saved of the old one"));
+    const std::size_t name = line.find("renamed to ") + 11;
+    EXPECT_EQ(readFile(line.substr(name, line.find(' ', name) - name)), damaged);
+
+    Device device(options);
+    EXPECT_EQ(device.settings().all().size(), 3U);
+    EXPECT_TRUE(device.preferences().applications().empty());
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    , DamagedDatabase,
+    testing::Values(
+        Damage{"NoDatabase", [](std::string& bytes) { bytes = std::string(10000, 'x'); }, Database::Check::Quick,
+               "file is not a database"},
+        Damage{"OneByteOnly", [](std::string& bytes) { bytes = "x"; }, Database::Check::Quick, "it is cut short"},
+        Damage{"HalfAPage", [](std::string& bytes) { bytes.resize(2048); }, Database::Check::Quick,
+               "database disk image is malformed"},
+        Damage{"Magic", [](std::string& bytes) { bytes[3] = 'X'; }, Database::Check::Quick, "file is not a database"},
+        Damage{"PageSize", [](std::string& bytes) { bytes[16] = bytes[17] = 0x7f; }, Database::Check::Quick,
+               "file is not a database"},
+        Damage{"FileFormat", [](std::string& bytes) { bytes[18] = 9; }, Database::Check::Quick,
+               "its header names an unknown format"},
+        Damage{"SchemaFormat", [](std::string& bytes) { bytes[47] = 9; }, Database::Check::Quick,
+               "unsupported file format"},
+        Damage{"SchemaPage", [](std::string& bytes) { bytes.replace(100, 3900, 3900, '\xee'); }, Database::Check::Quick,
+               "database disk image is malformed"},
+        Damage{"OtherPages", [](std::string& bytes) { bytes.replace(20 * 4096, 4096, 4096, '\xee'); },
+               Database::Check::Full, "[^\n]*[Pp]age[^\n]*"},
+        Damage{"CutShort", [](std::string& bytes) { bytes.resize(bytes.size() - 5 * 4096 - 7); }, Database::Check::Full,
+               "database disk image is malformed"}),
+    [](const auto& damage) { return damage.param.name; });
+
+TEST(Database, OfSomethingElseIsSetAside) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path());
+    {
+        SQLite::Database other(options.folder.database().string(), SQLite::OPEN_READWRITE | SQLite::OPEN_CREATE);
+        other.exec("CREATE TABLE stranger (id INTEGER)");
+    }
+    EXPECT_THAT(
+        messageOf([&] { Device device(options); }),
+        MatchesRegex(options.folder.database().string() + ": is damaged \\(it is no database of a device\\);.*"));
+}
+
+TEST(Database, IsSetAsideTogetherWithItsLog) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path());
+    writeFile(options.folder.database(), std::string(10000, 'x'));
+    writeFile(options.folder.database().string() + "-wal", "log");
+    writeFile(options.folder.database().string() + "-shm", "index");
+    EXPECT_THROW(Device{options}, device::DamagedError);
+    EXPECT_THAT(filesIn(there.path()),
+                UnorderedElementsAre("device.db.lock", MatchesRegex("device\\.db\\.damaged-[0-9TZ]+"),
+                                     MatchesRegex("device\\.db\\.damaged-[0-9TZ]+-wal"),
+                                     MatchesRegex("device\\.db\\.damaged-[0-9TZ]+-shm")));
+}
+
+TEST(Database, ThatIsDamagedAgainWithinASecondGetsANameOfItsOwn) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path());
+    for (int number = 0; number < 5; ++number) {
+        writeFile(options.folder.database(), "damage " + std::to_string(number) + std::string(5000, 'x'));
+        EXPECT_THROW(Device{options}, device::DamagedError);
+    }
+    std::vector<std::string> kept;
+    for (const std::string& name : filesIn(there.path()))
+        if (name.find(".damaged-") != std::string::npos)
+            kept.push_back(readFile(there.path() / name).substr(0, 8));
+    EXPECT_THAT(kept, UnorderedElementsAre("damage 0", "damage 1", "damage 2", "damage 3", "damage 4"));
+}
+
+TEST(Database, ThatIsDamagedIsSetAsideByOneOfManyProcesses) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path());
+    writeFile(options.folder.database(), std::string(10000, 'x'));
+    std::vector<Process> processes;
+    for (int number = 0; number < 6; ++number)
+        processes.push_back(Process::ofWork([&] {
+            try {
+                Device device(options);
+                return 0;
+            } catch (const device::DamagedError&) {
+                return 1;
+            }
+        }));
+    int setAside = 0;
+    for (Process& process : processes)
+        setAside += process.wait();
+    EXPECT_EQ(setAside, 1);
+    EXPECT_EQ(Device(options).settings().all().size(), 3U);
+}
+
+TEST(Database, WhoseDamageShowsInUseIsCheckedWholeAtTheNextStart) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path());
+    const std::string file = options.folder.database().string();
+    {
+        Device device(options);
+        for (int number = 0; number < 50; ++number)
+            device.preferences().set("com.example.app", std::to_string(number), std::string(2000, 'x'));
+    }
+    std::string bytes = readFile(file);
+    bytes.replace(4096, bytes.size() - 4096, bytes.size() - 4096, '\xee');
+    writeFile(file, bytes);
+    {
+        Device device(options);
+        EXPECT_EQ(messageOf([&] { device.preferences().all("com.example.app"); }),
+                  file + ": is damaged (database disk image is malformed); start the device anew, which sets the file "
+                         "aside");
+    }
+    EXPECT_THROW(Device{options}, device::DamagedError);
+    EXPECT_EQ(Device(options).settings().all().size(), 3U);
+    EXPECT_FALSE(std::filesystem::exists(options.folder.databaseSuspicion()));
+}
+
+TEST(Database, OfANewerVersionIsLeftAlone) {
+    TemporaryDevice device;
+    device->database().sql().exec("PRAGMA user_version = 7");
+    EXPECT_EQ(messageOf([&] { device.reopen(); }),
+              device.root().string() +
+                  "/device.db: was made by a newer version of this software (schema 7, this one knows 1); use that "
+                  "version, or another folder with KEST_DEVICE");
+    SQLite::Database untouched((device.root() / "device.db").string());
+    EXPECT_EQ(untouched.execAndGet("PRAGMA user_version").getInt(), 7);
+}
+
+TEST(Database, MustBeAFile) {
+    const TemporaryFolder there;
+    std::filesystem::create_directory(there.path() / "device.db");
+    EXPECT_EQ(messageOf([&] { Device device(optionsFor(there.path())); }),
+              there.path().string() +
+                  "/device.db: is not a file; move it away, and the device begins with a fresh database");
+    std::filesystem::remove(there.path() / "device.db");
+    ASSERT_EQ(mkfifo((there.path() / "device.db").c_str(), 0600), 0);
+    EXPECT_EQ(messageOf([&] { Device device(optionsFor(there.path())); }),
+              there.path().string() +
+                  "/device.db: is not a file; move it away, and the device begins with a fresh database");
+}
+
+TEST(Database, ThatMayNotBeWrittenIsToldOf) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path() / "device");
+    Device{options};
+    auto other = Process::ofWork([&] {
+        for (const auto& entry : std::filesystem::recursive_directory_iterator(there.path()))
+            if (chmod(entry.path().c_str(), entry.is_directory() ? 0777 : 0666) != 0)
+                return 2;
+        chmod(there.path().c_str(), 0755);
+        chmod(options.folder.database().c_str(), 0444);
+        if (geteuid() == 0 && setuid(65534) != 0)
+            return 3;
+        return messageOf([&] { Device device(options); }) ==
+                       options.folder.database().string() +
+                           ": cannot be written; make it and its folder writable for this user"
+                   ? 0
+                   : 1;
+    });
+    EXPECT_EQ(other.wait(), 0);
+}
+
+TEST(Database, ThatIsFullSaysSoAndLosesNothing) {
+    const TemporaryDevice device;
+    device->preferences().set("com.example.app", "before", "kept");
+    device->database().sql().exec("PRAGMA max_page_count = 20");
+    EXPECT_EQ(messageOf([&] { device->preferences().set("com.example.app", "big", std::string(1 << 20, 'x')); }),
+              device.root().string() +
+                  "/device.db: the disk is full (database or disk is full); free some space and try again");
+    EXPECT_EQ(device->preferences().get("com.example.app", "before"), "kept");
+    EXPECT_EQ(device->preferences().get("com.example.app", "big"), std::nullopt);
+    device->preferences().set("com.example.app", "small", "fits");
+    EXPECT_EQ(device->preferences().get("com.example.app", "small"), "fits");
+}
+
+TEST(Database, OnADiskThatIsFullSaysSoAndIsSoundAfterwards) {
+    const TemporaryDevice device;
+    auto writer = Process::ofWork([&] {
+        signal(SIGXFSZ, SIG_IGN);
+        Device same(device.options());
+        same.preferences().set("com.example.app", "before", "kept");
+        const rlimit limit{200 * 1024, 200 * 1024};
+        setrlimit(RLIMIT_FSIZE, &limit);
+        const std::string line =
+            messageOf([&] { same.preferences().set("com.example.app", "big", std::string(1 << 20, 'x')); });
+        if (line != device.root().string() + "/device.db: cannot be read or written (disk I/O error); check that its "
+                                             "disk is neither full nor broken")
+            return 1;
+        return same.preferences().get("com.example.app", "before") == "kept" ? 0 : 2;
+    });
+    EXPECT_EQ(writer.wait(), 0);
+    Device same(device.options(Database::Check::Full));
+    EXPECT_EQ(same.preferences().get("com.example.app", "before"), "kept");
+    EXPECT_EQ(same.preferences().get("com.example.app", "big"), std::nullopt);
+}
+
+TEST(Database, ThatCannotBeMadeOnAFullDiskSaysSo) {
+    const TemporaryFolder there;
+    auto maker = Process::ofWork([&] {
+        signal(SIGXFSZ, SIG_IGN);
+        const rlimit limit{2000, 2000};
+        setrlimit(RLIMIT_FSIZE, &limit);
+        const std::string line = messageOf([&] { Device device(optionsFor(there.path())); });
+        return line == there.path().string() + "/device.db: cannot be read or written (disk I/O error); check that its "
+                                               "disk is neither full nor broken"
+                   ? 0
+                   : 1;
+    });
+    EXPECT_EQ(maker.wait(), 0);
+    EXPECT_EQ(Device(optionsFor(there.path(), Database::Check::Full)).settings().all().size(), 3U);
+}
+
+TEST(Database, ThatAnotherProcessHoldsSaysSo) {
+    const TemporaryDevice device;
+    device->database().sql().exec("PRAGMA busy_timeout = 1");
+    SQLite::Database other((device.root() / "device.db").string(), SQLite::OPEN_READWRITE);
+    other.exec("BEGIN IMMEDIATE");
+    EXPECT_EQ(messageOf([&] { device->preferences().set("com.example.app", "key", "value"); }),
+              device.root().string() +
+                  "/device.db: is held by another process (database is locked); end that process and try again");
+    other.exec("ROLLBACK");
+    device->preferences().set("com.example.app", "key", "value");
+    EXPECT_EQ(device->preferences().get("com.example.app", "key"), "value");
+}
+
+TEST(Database, FailureInOneStatementDoesNotSpoilTheNextUseOfIt) {
+    const TemporaryDevice device;
+    SQLite::Database& sql = device->database().sql();
+    sql.exec("CREATE TRIGGER refuse BEFORE INSERT ON preference BEGIN SELECT RAISE(ABORT, 'refused'); END");
+    EXPECT_EQ(messageOf([&] { device->preferences().set("com.example.app", "key", "value"); }),
+              device.root().string() + "/device.db: cannot be used (refused)");
+    sql.exec("DROP TRIGGER refuse");
+    device->preferences().set("com.example.app", "key", "value");
+    EXPECT_EQ(device->preferences().get("com.example.app", "key"), "value");
+}
+
+}  // namespace
