@@ -1,3 +1,4 @@
+#include "HelpFormatter.h"
 #include "Output.h"
 #include "Session.h"
 #include "commands/Commands.h"
@@ -13,7 +14,7 @@ constexpr int wrongUsage = 2;
 
 constexpr char about[] =
     "Runs and controls a device on this workstation: its applications, settings, packages, log and\n"
-    "screen. A device is a folder: $KEST_DEVICE, else kest-device in the user's state folder.\n";
+    "screen. A device is a folder: $KEST_DEVICE, else kest-device in the user's state folder.";
 
 constexpr char examples[] = R"(Examples:
   kest-device start --headless            start Tips without a display
@@ -42,10 +43,9 @@ void describe(CLI::App& app, tool::Session& session) {
     app.name("kest-device");
     app.set_version_flag("--version", "kest-device " PROJECT_VERSION, "Print the version and end");
     app.set_help_flag("-h,--help", "Print this help and end");
-    app.footer(examples);
     app.require_subcommand(1);
-    app.get_formatter()->label("SUBCOMMAND", "COMMAND");
-    app.get_formatter()->label("Subcommands", "Commands");
+    app.formatter(std::make_shared<tool::HelpFormatter>());
+    app.get_formatter()->column_width(26);
     for (const auto add :
          {tool::addStart, tool::addStop,        tool::addStatus,  tool::addReset,     tool::addGet,
           tool::addSet,   tool::addUnset,       tool::addInstall, tool::addUninstall, tool::addPackages,
@@ -53,6 +53,11 @@ void describe(CLI::App& app, tool::Session& session) {
           tool::addTap,   tool::addSwipe,       tool::addKey,     tool::addWaitFor,   tool::addScreenshot}) {
         add(app, session);
     }
+    for (CLI::App* command : app.get_subcommands({})) {
+        command->group("Commands");
+    }
+    // Last: a command takes over what the tool has when it is added.
+    app.footer(examples);
 }
 
 /// The bus carries no other text, and a command line can hold anything.

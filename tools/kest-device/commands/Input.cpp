@@ -2,7 +2,9 @@
 #include "Commands.h"
 #include "device/Error.h"
 
+#include <array>
 #include <iostream>
+#include <optional>
 
 namespace tool {
 
@@ -31,7 +33,9 @@ Example:
   kest-device key Escape)";
 
 struct Options {
-    std::vector<int> places;
+    std::optional<int> x;
+    std::optional<int> y;
+    std::array<int, 4> places{};
     std::string text;
     double seconds = 0.15;
     std::string key;
@@ -53,13 +57,13 @@ void send(Session& session, const std::string& appId, const std::string& method,
 }
 
 void tap(Session& session, const Options& options, bool byText) {
-    if (byText == !options.places.empty()) {
+    if (byText == options.x.has_value() || options.x.has_value() != options.y.has_value()) {
         throw UsageError("tap needs either X and Y or --text");
     }
     if (byText) {
         send(session, options.appId, "TapText", {options.text});
     } else {
-        send(session, options.appId, "Tap", {options.places[0], options.places[1]});
+        send(session, options.appId, "Tap", {*options.x, *options.y});
     }
 }
 
@@ -68,7 +72,8 @@ void tap(Session& session, const Options& options, bool byText) {
 void addTap(CLI::App& app, Session& session) {
     CLI::App* command = app.add_subcommand("tap", "Touch the screen");
     const auto options = std::make_shared<Options>();
-    command->add_option("place", options->places, "The place, in pixels")->type_name("X Y")->expected(2);
+    command->add_option("x", options->x, "The place, in pixels from the left")->type_name("X");
+    command->add_option("y", options->y, "and from the top")->type_name("Y");
     const CLI::Option* text = command->add_option("--text", options->text, "A text in sight")->type_name("TEXT");
     addAppOption(*command, options->appId);
     command->footer(tapAbout);
@@ -78,15 +83,18 @@ void addTap(CLI::App& app, Session& session) {
 void addSwipe(CLI::App& app, Session& session) {
     CLI::App* command = app.add_subcommand("swipe", "Move a finger over the screen");
     const auto options = std::make_shared<Options>();
-    command->add_option("places", options->places, "From and to, in pixels")
-        ->type_name("X1 Y1 X2 Y2")
-        ->expected(4)
-        ->required();
+    static constexpr std::array names{"x1", "y1", "x2", "y2"};
+    static constexpr std::array labels{"X1", "Y1", "X2", "Y2"};
+    static constexpr std::array meanings{"From, in pixels from the left", "and from the top", "To, from the left",
+                                         "and from the top"};
+    for (std::size_t i = 0; i < names.size(); ++i) {
+        command->add_option(names[i], options->places[i], meanings[i])->type_name(labels[i])->required();
+    }
     command->add_option("--seconds", options->seconds, "How long it takes")->type_name("S")->capture_default_str();
     addAppOption(*command, options->appId);
     command->footer(swipeAbout);
     command->callback([options, &session] {
-        const std::vector<int>& at = options->places;
+        const std::array<int, 4>& at = options->places;
         send(session, options->appId, "Swipe", {at[0], at[1], at[2], at[3], options->seconds});
     });
 }

@@ -8,7 +8,8 @@ namespace tool {
 namespace {
 
 constexpr char about[] =
-    R"(The picture has the size of the device's display. An older file of that name is replaced, once the new one is whole.
+    R"(The picture has the size of the device's display. An older file of that name is replaced once the new one is
+whole.
 
 Example:
   kest-device screenshot list.png)";

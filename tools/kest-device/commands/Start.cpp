@@ -117,8 +117,8 @@ void addStart(CLI::App& app, Session& session) {
     const auto options = std::make_shared<Options>();
     command->add_flag("--headless", options->headless, "Draw into memory: no window, no display needed");
     command->add_option("--screen", options->screen, "The device's display from now on")->type_name("720x1280|480x800");
-    command->add_option("request", options->request, "Application and extras, after --")
-        ->type_name("APPID [KEY=VALUE...]");
+    command->add_option("request", options->request, "The application, and the extras of its launch request")
+        ->type_name("-- APPID [KEY=VALUE...]");
     addJsonOption(*command, options->json);
     command->footer(examples);
     command->callback([options, &session] { start(session, *options); });

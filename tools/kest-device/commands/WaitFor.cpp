@@ -5,6 +5,7 @@
 #include "device/Error.h"
 
 #include <chrono>
+#include <sstream>
 #include <thread>
 
 namespace tool {
@@ -107,8 +108,8 @@ void addWaitFor(CLI::App& app, Session& session) {
     const auto options = std::make_shared<Options>();
     command->add_option("condition", options->condition, "What to wait for")->type_name("CONDITION")->required();
     command->add_option("--timeout", options->seconds, "How long at most, in seconds")
+        ->check(CLI::Range(0.0, 86400.0).description(""))
         ->type_name("S")
-        ->check(CLI::Range(0.0, 86400.0))
         ->capture_default_str();
     addAppOption(*command, options->appId);
     command->footer(about);
