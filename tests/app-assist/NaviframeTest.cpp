@@ -9,10 +9,15 @@
 #include <utility>
 
 using app_assist::WNaviframe;
+using app_assist::WView;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
 namespace {
+
+class UnnamedView : public WView {
+    Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_button_add(parent); }
+};
 
 class Naviframe : public test_ui::UiTest {
 protected:
@@ -60,6 +65,14 @@ TEST_F(Naviframe, APushedViewIsCreatedPutOnTheStackAndTold) {
     EXPECT_EQ(view, naviframe_->getTopView());
     EXPECT_TRUE(naviframe_->isTopView(view));
     EXPECT_FALSE(naviframe_->isTopView(nullptr));
+}
+
+TEST_F(Naviframe, AViewStandsInTheTreeUnderTheNameOfItsClass) {
+    auto* view = new UnnamedView();
+    naviframe_->push(view, nullptr, nullptr);
+    EXPECT_STREQ("(anonymous namespace)::UnnamedView", view->getClassName());
+    EXPECT_STREQ(view->getClassName(), evas_object_name_get(view->getEvasObj()));
+    EXPECT_STREQ("list", evas_object_name_get(push("list")->getEvasObj()));
 }
 
 TEST_F(Naviframe, APoppedViewIsAskedDestroyedAndDeletedAndTheOneBelowBecomesTop) {

@@ -13,12 +13,24 @@ namespace {
 
 PreinitializedWindow* currentWindow = nullptr;
 
+/// Under this name a window knows the object that gives it its size.
+constexpr char sizeKey[] = "app_assist display size";
+
 }  // namespace
 
+// A window takes its limits from what it resizes along, so it gets something of one size that never draws.
 void fitToDisplay(Evas_Object* window) {
     const device::Screen& screen = device::Device::current().screen();
-    evas_object_size_hint_min_set(window, screen.width, screen.height);
-    evas_object_size_hint_max_set(window, screen.width, screen.height);
+    auto* size = static_cast<Evas_Object*>(evas_object_data_get(window, sizeKey));
+    if (!size) {
+        size = evas_object_rectangle_add(evas_object_evas_get(window));
+        evas_object_color_set(size, 0, 0, 0, 0);
+        evas_object_pass_events_set(size, EINA_TRUE);
+        elm_win_resize_object_add(window, size);
+        evas_object_data_set(window, sizeKey, size);
+    }
+    evas_object_size_hint_min_set(size, screen.width, screen.height);
+    evas_object_size_hint_max_set(size, screen.width, screen.height);
     evas_object_resize(window, screen.width, screen.height);
 }
 

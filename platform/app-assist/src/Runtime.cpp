@@ -67,7 +67,10 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
             sayError("the application could not start");
             return 1;
         }
-        return joinBus();
+        if (const auto status = joinBus())
+            return status;
+        queueFirstRequest();
+        return std::nullopt;
     } catch (const std::exception& error) {
         sayError(error.what());
         return 1;
@@ -101,7 +104,12 @@ std::optional<int> Runtime::joinBus() {
     const auto window = [this]() -> Evas_Object* {
         return app_.getWindow() ? app_.getWindow()->getEvasObj() : nullptr;
     };
-    presence_.emplace(*device_, window, [] { elm_exit(); });
+    try {
+        presence_.emplace(*device_, window, [] { elm_exit(); });
+    } catch (const device::Error& error) {
+        say(std::string(error.what()) + "; remote control is off");
+        return std::nullopt;
+    }
     switch (presence_->result()) {
     case BusPresence::Result::OtherDevice:
         sayError("the bus belongs to the device in " + presence_->otherFolder() + ", not to the one in " +
@@ -112,10 +120,14 @@ std::optional<int> Runtime::joinBus() {
         return 0;
     case BusPresence::Result::NoBus:
         say("there is no bus: remote control is off");
-        break;
+        return std::nullopt;
     case BusPresence::Result::Joined:
-        break;
+        return std::nullopt;
     }
+    return std::nullopt;
+}
+
+void Runtime::queueFirstRequest() {
     // From inside the main loop, so that it can end the application.
     firstRequest_ = ecore_job_add(
         [](void* data) {
@@ -124,7 +136,6 @@ std::optional<int> Runtime::joinBus() {
             guarded("a launch request", [self] { self->deliver(self->extras_); });
         },
         this);
-    return std::nullopt;
 }
 
 void Runtime::deliver(const LaunchRequest::Extras& extras) {

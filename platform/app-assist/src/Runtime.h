@@ -31,6 +31,7 @@ private:
     void startToolkit(int argc, char** argv);
     bool createApplication(int argc, char** argv);
     std::optional<int> joinBus();
+    void queueFirstRequest();
     void deliver(const LaunchRequest::Extras& extras);
     void followDevice();
     void settingChanged(const std::string& key);

@@ -5,6 +5,11 @@
 #include "app-assist/WNaviframe.h"
 #include "app-assist/WPageSlideView.h"
 
+#include <cxxabi.h>
+
+#include <cstdlib>
+#include <typeinfo>
+
 namespace app_assist {
 
 WView::WView() : life_(std::make_shared<char>()) {}
@@ -68,7 +73,13 @@ Elm_Object_Item* WView::getNaviItem() const {
 }
 
 const char* WView::getClassName() const {
-    return "WView";
+    if (className_.empty()) {
+        const char* mangled = typeid(*this).name();
+        const std::unique_ptr<char, decltype(&std::free)> name(abi::__cxa_demangle(mangled, nullptr, nullptr, nullptr),
+                                                               std::free);
+        className_ = name ? name.get() : mangled;
+    }
+    return className_.c_str();
 }
 
 void WView::onCreated() {}

@@ -5,6 +5,7 @@
 #include <Elementary.h>
 
 #include <memory>
+#include <string>
 
 namespace app_assist {
 
@@ -24,7 +25,7 @@ public:
 
     ~WView() override;
 
-    /// The class's name, for people who look at the screen's tree.
+    /// The name of the view's class, under which it stands in the screen's tree. The base finds it out by itself.
     virtual const char* getClassName() const;
 
 protected:
@@ -64,6 +65,7 @@ private:
     std::weak_ptr<void> life() const { return life_; }
 
     std::shared_ptr<void> life_;
+    mutable std::string className_;
     bool ownsItself_ = false;
     Evas_Object* evasObject_ = nullptr;
     /// The page slide view that it is a page of.

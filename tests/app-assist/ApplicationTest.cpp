@@ -1,0 +1,285 @@
+#include "support/Environment.h"
+#include "support/TemporaryDevice.h"
+#include "ui/RunningApp.h"
+#include "ui/UiTest.h"
+
+#include <LaunchRequest.h>
+#include <app-assist/WApp.h>
+#include <app-assist/WAppEventHandler.h>
+#include <app-assist/WWindow.h>
+#include <device/Keys.h>
+#include <gmock/gmock.h>
+#include <libintl.h>
+#include <ui_extension.h>
+
+#include <cstdlib>
+#include <fstream>
+#include <utility>
+
+#include <unistd.h>
+
+using app_assist::WApp;
+using app_assist::WAppEventHandler;
+using test_ui::RunningApp;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace {
+
+using Story = std::vector<std::string>;
+
+/// An application that tells what the framework asks of it.
+class TellingApp : public WApp {
+public:
+    Story story;
+    bool creates = true;
+    std::function<void()> inCreate, inAppControl;
+
+protected:
+    void onStart(int argc, char** argv) override { tell("onStart " + std::to_string(argc) + " " + argv[argc - 1]); }
+    bool onCreate() override {
+        tell("onCreate");
+        if (inCreate)
+            inCreate();
+        return creates;
+    }
+    void onTerminate() override { tell("onTerminate"); }
+    void onPause() override { tell("onPause"); }
+    void onResume() override { tell("onResume"); }
+    void onAppControl(app_control_h request, bool firstLaunch) override {
+        char* id = nullptr;
+        app_control_get_app_id(request, &id);
+        std::string line = std::string("onAppControl ") + id + (firstLaunch ? " first" : " again");
+        std::free(id);
+        app_control_foreach_extra_data(
+            request,
+            [](app_control_h from, const char* key, void* data) {
+                char* value = nullptr;
+                app_control_get_extra_data(from, key, &value);
+                static_cast<std::string*>(data)->append(std::string(" ") + key + "=" + value);
+                std::free(value);
+                return true;
+            },
+            &line);
+        tell(line);
+        if (inAppControl)
+            inAppControl();
+    }
+
+private:
+    void tell(const std::string& what) { story.push_back(what); }
+};
+
+class Application : public test_ui::UiTest {
+protected:
+    void set(const char* key, const char* value) { device_->settings().set(key, value); }
+
+    support::TemporaryDevice device_;
+    TellingApp app_;
+};
+
+TEST_F(Application, LivesInOrder) {
+    {
+        RunningApp running(app_, {"appID=com.example.other", "page=2", "text=a=b"});
+        EXPECT_EQ(std::nullopt, running.status());
+        EXPECT_THAT(std::exchange(app_.story, {}), ElementsAre("onStart 4 text=a=b", "onCreate"));
+        test_ui::runFor(1.0);
+        EXPECT_THAT(
+            std::exchange(app_.story, {}),
+            ElementsAre("onAppControl com.example.app first appID=com.example.other page=2 text=a=b", "onResume"));
+    }
+    EXPECT_THAT(app_.story, ElementsAre("onPause", "onTerminate"));
+}
+
+TEST_F(Application, TheObjectIsTheProcesssForItsLife) {
+    EXPECT_EQ(&app_, WApp::getInstance());
+    {
+        auto other = std::make_unique<TellingApp>();
+        EXPECT_EQ(other.get(), WApp::getInstance());
+    }
+    EXPECT_EQ(nullptr, WApp::getInstance());
+}
+
+TEST_F(Application, MayEndInItsFirstLaunchRequest) {
+    app_.inAppControl = [] { elm_exit(); };
+    RunningApp running(app_);
+    EXPECT_FALSE(test_ui::hasEnded());
+    test_ui::runFor(1.0);
+    EXPECT_TRUE(test_ui::hasEnded());
+}
+
+TEST_F(Application, StartRunsTheMainLoopAndReturnsZero) {
+    app_.inAppControl = [] { elm_exit(); };
+    char name[] = "app";
+    char* argv[] = {name, nullptr};
+    EXPECT_EQ(0, app_.start(1, argv));
+    EXPECT_THAT(app_.story, ElementsAre("onStart 1 app", "onCreate", "onAppControl com.example.app first", "onResume",
+                                        "onPause", "onTerminate"));
+}
+
+/// Standard error of the application's start, without the program's name before each line.
+class ApplicationStart : public Application {
+protected:
+    std::string begin(const std::vector<std::string>& words = {}) {
+        testing::internal::CaptureStderr();
+        RunningApp running(app_, words);
+        status_ = running.status();
+        std::string said = testing::internal::GetCapturedStderr();
+        const std::string program = std::string(program_invocation_short_name) + ": ";
+        for (size_t at = 0; (at = said.find(program, at)) != std::string::npos;)
+            said.erase(at, program.size());
+        return said;
+    }
+    std::optional<int> status_;
+};
+
+TEST_F(ApplicationStart, SaysOnceThatThereIsNoBus) {
+    EXPECT_EQ("there is no bus: remote control is off\n", begin());
+    EXPECT_EQ(std::nullopt, status_);
+}
+
+TEST_F(ApplicationStart, WithAWordThatIsNoExtraEndsWithStatusTwoBeforeItTouchesAnything) {
+    EXPECT_EQ("error: 'hello' is no extra of a launch request: write KEY=VALUE\n", begin({"a=1", "hello"}));
+    EXPECT_EQ(2, status_);
+    EXPECT_EQ("error: '=1' is no extra of a launch request: write KEY=VALUE\n", begin({"=1"}));
+    EXPECT_EQ(2, status_);
+    EXPECT_THAT(app_.story, IsEmpty());
+}
+
+TEST_F(ApplicationStart, ThatTheApplicationRefusesEndsWithStatusOne) {
+    app_.creates = false;
+    EXPECT_EQ("error: the application could not start\n", begin());
+    EXPECT_EQ(1, status_);
+    EXPECT_THAT(app_.story, ElementsAre("onStart 1 app", "onCreate"));
+}
+
+TEST_F(ApplicationStart, ThatThrowsEndsWithStatusOne) {
+    app_.inCreate = [] { throw std::runtime_error("no more room"); };
+    EXPECT_EQ("error: no more room\n", begin());
+    EXPECT_EQ(1, status_);
+}
+
+TEST_F(Application, RunsAtTheRootWithItsToolkitsFilesInTheDevice) {
+    support::Environment unusable("XDG_RUNTIME_DIR", "/no/such/folder");
+    RunningApp running(app_);
+    const auto toolkit = device::Folder(device_.root()).toolkit();
+    EXPECT_EQ("/", std::filesystem::current_path());
+    EXPECT_EQ((toolkit / "config").string(), std::getenv("XDG_CONFIG_HOME"));
+    EXPECT_EQ((toolkit / "cache").string(), std::getenv("XDG_CACHE_HOME"));
+    EXPECT_EQ((toolkit / "run").string(), std::getenv("XDG_RUNTIME_DIR"));
+    EXPECT_EQ(std::filesystem::perms::owner_all, std::filesystem::status(toolkit / "run").permissions());
+}
+
+TEST_F(Application, KeepsARunDirectoryThatIsGood) {
+    const auto good = device_.folder() / "run";
+    std::filesystem::create_directory(good);
+    support::Environment environment("XDG_RUNTIME_DIR", good.string());
+    RunningApp running(app_);
+    EXPECT_EQ(good.string(), std::getenv("XDG_RUNTIME_DIR"));
+}
+
+TEST_F(Application, HasTheProfileAndTheScaleOfTheDevicesDisplay) {
+    {
+        RunningApp running(app_);
+        EXPECT_STREQ("mobile", elm_config_profile_get());
+        EXPECT_DOUBLE_EQ(2.6, elm_config_scale_get());
+    }
+    set(device::keys::screen, "480x800");
+    RunningApp running(app_);
+    EXPECT_DOUBLE_EQ(1.7, elm_config_scale_get());
+}
+
+TEST_F(Application, FindsItsOwnTextsAndTheDevices) {
+    RunningApp running(app_);
+    EXPECT_EQ((device_.appRoot() / "res/locale").string(), bindtextdomain("app", nullptr));
+    EXPECT_STREQ("UTF-8", bind_textdomain_codeset("app", nullptr));
+    EXPECT_EQ((device_.data() / "locale").string(), bindtextdomain("sys_string", nullptr));
+    EXPECT_STREQ("UTF-8", bind_textdomain_codeset("sys_string", nullptr));
+}
+
+TEST_F(Application, SpeaksTheDevicesLanguageBeforeItIsCreated) {
+    set(device::keys::language, "ru_RU.UTF-8");
+    std::string language;
+    app_.inCreate = [&] { language = std::getenv("LANGUAGE"); };
+    RunningApp running(app_);
+    EXPECT_EQ("ru_RU", language);
+    EXPECT_STRNE("C", setlocale(LC_MESSAGES, nullptr));
+}
+
+TEST_F(Application, ALanguageChangeReachesTheLocaleFirstAndThenTheHandlers) {
+    WAppEventHandler handler;
+    Story languages;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED,
+        [&](app_event_info_h info, void* userData) {
+            EXPECT_NE(nullptr, info);
+            EXPECT_EQ(&app_, userData);
+            languages.push_back(std::getenv("LANGUAGE"));
+        },
+        &app_);
+    handler.addEventHandler(
+        APP_EVENT_REGION_FORMAT_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
+    handler.addEventHandler(APP_EVENT_LANGUAGE_CHANGED, nullptr, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    set(device::keys::country, "IN");
+    EXPECT_THAT(languages, ElementsAre("ko_KR"));
+}
+
+TEST_F(Application, AHandlerMayDestroyItselfAndOthersWhileItRuns) {
+    auto first = std::make_unique<WAppEventHandler>();
+    auto second = std::make_unique<WAppEventHandler>();
+    int calls = 0;
+    first->addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED,
+        [&](app_event_info_h, void*) {
+            first.reset();
+            second.reset();
+            ++calls;
+        },
+        nullptr);
+    second->addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    set(device::keys::language, "ru_RU.UTF-8");
+    EXPECT_EQ(1, calls);
+}
+
+TEST_F(Application, AnExceptionInAHandlerStaysOutOfEflAndOfTheOthersWay) {
+    WAppEventHandler handler;
+    int calls = 0;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { throw std::runtime_error("no more room"); }, nullptr);
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(1, calls);
+    EXPECT_THAT(device_.logMessages(), testing::Contains("E APP_ASSIST an event handler failed: no more room"));
+}
+
+TEST_F(Application, AThemeChangeReachesTheThemeCallbacks) {
+    RunningApp running(app_);
+    int calls = 0;
+    const uxt_theme_changed_cb count = [](void* data) { ++*static_cast<int*>(data); };
+    uxt_theme_add_changed_callback(nullptr, count, &calls);
+    set(device::keys::theme, "dark");
+    EXPECT_EQ(1, calls);
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(1, calls);
+    uxt_theme_delete_changed_callback(nullptr, count);
+}
+
+TEST_F(Application, HearsOfNothingAfterItsEnd) {
+    WAppEventHandler handler;
+    int calls = 0;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
+    RunningApp running(app_);
+    running.end();
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(0, calls);
+}
+
+}  // namespace
