@@ -1,0 +1,97 @@
+#include "support/Environment.h"
+#include "support/TemporaryDevice.h"
+#include "ui/UiTest.h"
+
+#include <device/Keys.h>
+#include <efl-answers/DisplayLanguage.h>
+#include <gmock/gmock.h>
+
+#include <dlfcn.h>
+#include <locale.h>
+
+using test_ui::Rect;
+
+namespace {
+
+class EflAnswers : public test_ui::UiTest {
+protected:
+    static Rect screenSize() {
+        Rect screen;
+        elm_win_screen_size_get(nullptr, &screen.x, &screen.y, &screen.width, &screen.height);
+        return screen;
+    }
+
+    support::TemporaryDevice device_;
+};
+
+TEST_F(EflAnswers, AreWhatEflItselfCallsToo) {
+    EXPECT_EQ(reinterpret_cast<void*>(elm_win_screen_size_get), dlsym(RTLD_DEFAULT, "elm_win_screen_size_get"));
+    EXPECT_EQ(reinterpret_cast<void*>(elm_theme_extension_add), dlsym(RTLD_DEFAULT, "elm_theme_extension_add"));
+    EXPECT_EQ(reinterpret_cast<void*>(elm_language_set), dlsym(RTLD_DEFAULT, "elm_language_set"));
+    Dl_info where = {};
+    ASSERT_NE(0, dladdr(dlsym(RTLD_DEFAULT, "elm_language_set"), &where));
+    EXPECT_THAT(where.dli_fname, testing::HasSubstr("efl-answers-tests"));
+}
+
+TEST_F(EflAnswers, TheScreenIsTheDevicesWhateverShowsIt) {
+    EXPECT_EQ((Rect{0, 0, 720, 1280}), screenSize());
+    device_->settings().set(device::keys::screen, "480x800");
+    EXPECT_EQ((Rect{0, 0, 480, 800}), screenSize());
+    elm_win_screen_size_get(window(), nullptr, nullptr, nullptr, nullptr);
+}
+
+TEST_F(EflAnswers, AThemeFileIsAddedOnce) {
+    const auto count = [] { return eina_list_count(elm_theme_extension_list_get(nullptr)); };
+    const std::string file = "/usr/share/elementary/themes/default.edj";
+    elm_theme_extension_add(nullptr, file.c_str());
+    elm_theme_extension_add(nullptr, file.c_str());
+    elm_theme_extension_add(nullptr, nullptr);
+    EXPECT_EQ(1u, count());
+    EXPECT_EQ(file, static_cast<const char*>(eina_list_data_get(elm_theme_extension_list_get(nullptr))));
+    const auto other = device_.folder() / "other.edj";
+    std::filesystem::copy_file(file, other);
+    elm_theme_extension_add(nullptr, other.c_str());
+    EXPECT_EQ(2u, count());
+
+    Elm_Theme* own = elm_theme_new();
+    elm_theme_extension_add(own, file.c_str());
+    EXPECT_EQ(1u, eina_list_count(elm_theme_extension_list_get(own)));
+    elm_theme_free(own);
+}
+
+class EflLanguage : public EflAnswers {
+protected:
+    EflLanguage() {
+        DisplayLanguage::bindTexts("drinks", TEST_TEXTS);
+        label_ = elm_label_add(window());
+        elm_object_domain_translatable_text_set(label_, "drinks", "IDS_TEA");
+        evas_object_smart_callback_add(
+            label_, "language,changed", [](void* changes, Evas_Object*, void*) { ++*static_cast<int*>(changes); },
+            &changes_);
+    }
+
+    Evas_Object* label_;
+    int changes_ = 0;
+};
+
+TEST_F(EflLanguage, ChangesTextsOnScreenOnAWorkstationWithoutItsLocale) {
+    elm_language_set("ru_RU");
+    EXPECT_EQ("Чай", test_ui::text(label_));
+    elm_language_set("ko_KR.EUC-KR");
+    EXPECT_EQ("차", test_ui::text(label_));
+    EXPECT_STREQ("ko_KR", std::getenv("LANGUAGE"));
+    EXPECT_STRNE("C", setlocale(LC_MESSAGES, nullptr));
+    elm_language_set("C");
+    EXPECT_EQ("IDS_TEA", test_ui::text(label_));
+    EXPECT_EQ(3, changes_);
+}
+
+TEST_F(EflLanguage, WithoutANameTranslatesAnewInTheLanguageThatIs) {
+    elm_language_set("ru_RU");
+    elm_language_set(nullptr);
+    EXPECT_EQ("Чай", test_ui::text(label_));
+    EXPECT_STREQ("ru_RU", std::getenv("LANGUAGE"));
+    EXPECT_EQ(2, changes_);
+}
+
+}  // namespace
