@@ -3,12 +3,12 @@
 #include "BlockingConnection.h"
 #include "BusAddress.h"
 #include "device/Error.h"
+#include "device/MainLoop.h"
 
 #include <Ecore.h>
 
 #include <algorithm>
 #include <cstdio>
-#include <cstdlib>
 #include <exception>
 
 namespace device {
@@ -22,11 +22,10 @@ std::string bus::pathOf(const std::string& appId) {
 
 namespace {
 
-/// Starts Eldbus, and Ecore below it, once for the whole process: EFL does not bear being ended and begun again
-/// while child processes come and go.
+/// Once for the whole process, as the main loop that it needs.
 void startEldbus() {
-    // Ecore's system modules report battery and time zone over the system bus; where there is none they complain.
-    static const bool started = setenv("ECORE_NO_SYSTEM_MODULES", "1", 0) == 0 && eldbus_init() > 0;
+    startMainLoop();
+    static const bool started = eldbus_init() > 0;
     if (!started)
         throw Error("Eldbus cannot be started; check the installation of EFL");
 }

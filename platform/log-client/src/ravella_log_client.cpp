@@ -1,6 +1,7 @@
 #include "ravella-log-client.h"
 
 #include "Service.h"
+#include "device/MainLoop.h"
 
 #include <Ecore.h>
 
@@ -11,15 +12,6 @@
 #include <vector>
 
 namespace {
-
-/// Keeps the main loop's library in use.
-class MainLoop {
-public:
-    MainLoop() { ecore_init(); }
-    ~MainLoop() { ecore_shutdown(); }
-    MainLoop(const MainLoop&) = delete;
-    MainLoop& operator=(const MainLoop&) = delete;
-};
 
 /// A callback that the main loop has yet to make.
 struct Answer {
@@ -67,7 +59,6 @@ private:
         answer.callback(answer.requestId, TIZEN_ERROR_NONE, answer.userData);
     }
 
-    MainLoop loop_;
     std::list<Answer> answers_;
 };
 
@@ -85,6 +76,8 @@ int ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bu
     return service::callOnDevice("ravella_log_manager_insert", [&](device::Device& device) -> int {
         if (!handle || !isContentUri(uri) || !record)
             return TIZEN_ERROR_INVALID_PARAMETER;
+        if (callback)
+            device::startMainLoop();
         const auto id = static_cast<int>(device.usage().append(uri, stringsOf(record)));
         if (request_id)
             *request_id = id;

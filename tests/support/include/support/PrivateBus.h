@@ -1,5 +1,6 @@
 #pragma once
 
+#include "device/MainLoop.h"
 #include "support/Environment.h"
 #include "support/Process.h"
 #include "support/TemporaryFolder.h"
@@ -21,7 +22,7 @@ namespace support {
 /// A child process that may use the main loop and the bus, whether or not the test has used them before.
 inline Process processOnTheBus(const std::function<int()>& work) {
     return Process::ofWork([&work] {
-        ecore_init();
+        device::startMainLoop();
         ecore_fork_reset();
         return work();
     });
@@ -30,6 +31,7 @@ inline Process processOnTheBus(const std::function<int()>& work) {
 /// Runs the main loop until `done` says so; false when it did not within the time, which a passing test never needs.
 inline bool runLoopUntil(const std::function<bool()>& done,
                          std::chrono::milliseconds patience = std::chrono::seconds(20)) {
+    device::startMainLoop();
     const auto end = std::chrono::steady_clock::now() + patience;
     // The loop may wait for something that never comes; it wakes up now and then to look at the time.
     Ecore_Timer* waking = ecore_timer_add(
