@@ -18,7 +18,7 @@ TEST_F(Reset, MakesTheDeviceAsNew) {
 
     EXPECT_EQ(run({"get", "language"}), done("en_US\n"));
     EXPECT_EQ(run({"log"}), done());
-    EXPECT_FALSE(fs::exists(device_.root() / "opt"));
+    EXPECT_FALSE(fs::exists(device_.root() / "opt/usr/apps/com.example.game"));
 }
 
 TEST_F(Reset, LeavesWhatIsNotTheDevices) {

@@ -105,7 +105,7 @@ TEST_F(ScreenReader, GivesMarkupAsItReads) {
 TEST_F(ScreenReader, ReadsTextsFromTopToBottomAndThoseOutOfSightLast) {
     const std::vector<Text> texts = textsOf(read());
 
-    ASSERT_THAT(texts, SizeIs(41));
+    ASSERT_THAT(texts, SizeIs(testing::Ge(41U)));
     EXPECT_EQ(texts[0].text, "Fruits");
     EXPECT_EQ(texts[1].text, "Apple");
     EXPECT_EQ(texts[2].text, "Fruit 1");

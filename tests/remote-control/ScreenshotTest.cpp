@@ -93,6 +93,7 @@ TEST_F(Screenshot, ReplacesAnOlderFile) {
 
 TEST_F(Screenshot, OnAFullDiskTheOlderFileStays) {
     support::writeFile(file(), "old");
+    toolkit_.log().expect("Image save failed");
     const FullDisk disk(100);
 
     EXPECT_EQ(errorOf([this] { writeScreenshot(window(), file()); }),

@@ -1,7 +1,9 @@
 #include "Settling.h"
 
 #include "SampleTest.h"
+#include "ScrollWatch.h"
 
+using remote_control::ScrollWatch;
 using remote_control::Settling;
 
 namespace {
@@ -12,7 +14,8 @@ protected:
     double settledAfter() {
         const double begin = ecore_loop_time_get();
         bool settled = false;
-        const Settling settling(evas_object_evas_get(window()), [&] { settled = true; });
+        const ScrollWatch scrolls(evas_object_evas_get(window()));
+        const Settling settling(evas_object_evas_get(window()), scrolls, [&] { settled = true; });
         EXPECT_TRUE(test_ui::runUntil([&] { return settled; }, 10));
         return ecore_loop_time_get() - begin;
     }
@@ -70,9 +73,34 @@ TEST_F(ScreenSettling, ChangesMadeMeanwhileBeginItAnew) {
 TEST_F(ScreenSettling, SaysNothingOnceItIsDestroyed) {
     bool settled = false;
     {
-        const Settling settling(evas_object_evas_get(window()), [&] { settled = true; });
+        const ScrollWatch scrolls(evas_object_evas_get(window()));
+        const Settling settling(evas_object_evas_get(window()), scrolls, [&] { settled = true; });
     }
     test_ui::runFor(4);
 
     EXPECT_FALSE(settled);
+}
+
+TEST_F(ScreenSettling, AScrollingListIsWaitedForToItsEnd) {
+    const ScrollWatch scrolls(evas_object_evas_get(window()));
+    screen().swipe({360, 1000}, {360, 300}, 0.2);
+    ASSERT_TRUE(scrolls.isScrolling());
+    bool settled = false;
+    const Settling settling(evas_object_evas_get(window()), scrolls, [&] { settled = true; });
+
+    ASSERT_TRUE(test_ui::runUntil([&] { return settled; }));
+
+    EXPECT_FALSE(scrolls.isScrolling());
+    screen().tap({360, 600});
+    EXPECT_EQ(sample_->choices(), 1) << "the tap counts";
+}
+
+TEST_F(ScreenSettling, AListThatGoesWhileItScrollsIsForgotten) {
+    const ScrollWatch scrolls(evas_object_evas_get(window()));
+    screen().swipe({360, 1000}, {360, 300}, 0.2);
+    ASSERT_TRUE(scrolls.isScrolling());
+
+    evas_object_del(sample_->stack());
+
+    EXPECT_FALSE(scrolls.isScrolling());
 }

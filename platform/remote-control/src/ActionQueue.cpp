@@ -16,6 +16,7 @@ ActionQueue::~ActionQueue() {
     forgetCanvas();
     playback_.reset();
     settling_.reset();
+    scrolls_.reset();
     bool first = true;
     for (const Action& action : actions_) {
         guarded([&] { action.done(first && carriedOut ? "" : closed); });
@@ -37,6 +38,7 @@ void ActionQueue::begin() {
         std::vector<Playback::Step> steps = actions_.front().steps(canvas);
         canvas_ = canvas;
         evas_event_callback_add(canvas_, EVAS_CALLBACK_FREE, onCanvasFree, this);
+        scrolls_ = std::make_unique<ScrollWatch>(canvas_);
         playback_ = std::make_unique<Playback>(std::move(steps), [this] { settle(); });
         return;
     } catch (const std::exception& failure) {
@@ -46,7 +48,7 @@ void ActionQueue::begin() {
 }
 
 void ActionQueue::settle() {
-    settling_ = std::make_unique<Settling>(canvas_, [this] { end(""); });
+    settling_ = std::make_unique<Settling>(canvas_, *scrolls_, [this] { end(""); });
     playback_.reset();
 }
 
@@ -54,6 +56,7 @@ void ActionQueue::end(const std::string& error) {
     forgetCanvas();
     playback_.reset();
     settling_.reset();
+    scrolls_.reset();
     const Action action = std::move(actions_.front());
     actions_.pop_front();
     action.done(error);

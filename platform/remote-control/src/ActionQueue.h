@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Playback.h"
+#include "ScrollWatch.h"
 #include "Settling.h"
 
 #include <Evas.h>
@@ -43,6 +44,7 @@ private:
     std::function<Evas*()> canvasOfNow_;
     std::deque<Action> actions_;  ///< the first one is under way
     Evas* canvas_ = nullptr;
+    std::unique_ptr<ScrollWatch> scrolls_;
     std::unique_ptr<Playback> playback_;
     std::unique_ptr<Settling> settling_;
 };

@@ -1,13 +1,12 @@
 #include "Element.h"
 #include "ListRows.h"
+#include "Objects.h"
 #include "ThemeParts.h"
 
 #include <Edje.h>
 #include <Elementary.h>
 
-#include <array>
 #include <memory>
-#include <string_view>
 
 namespace remote_control {
 
@@ -29,10 +28,6 @@ bool opaqueEnough(const Evas_Object* object) {
     return alpha > 0;
 }
 
-bool isWidget(const Evas_Object* object) {
-    return object && elm_object_widget_check(object);
-}
-
 bool holdsSomething(const Element& element) {
     return !element.name.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
            !element.items.empty();
@@ -43,27 +38,9 @@ bool tellsSomething(const Element& element) {
     return holdsSomething(element) || (!element.place.empty() && element.type != "Elm_Win");
 }
 
-/// The objects that draw have no members, and EFL complains when it is asked for them.
-bool canHaveMembers(std::string_view type) {
-    static constexpr std::array drawing{"rectangle", "line", "polygon", "text", "textblock", "textgrid", "image", "vg"};
-    return std::find(drawing.begin(), drawing.end(), type) == drawing.end();
-}
-
 struct ListFree {
     void operator()(Eina_List* list) const { eina_list_free(list); }
 };
-
-std::vector<Evas_Object*> membersOf(Evas_Object* object) {
-    std::vector<Evas_Object*> members;
-    if (!canHaveMembers(orEmpty(evas_object_type_get(object)))) {
-        return members;
-    }
-    const std::unique_ptr<Eina_List, ListFree> list(evas_object_smart_members_get(object));
-    for (const Eina_List* node = list.get(); node; node = eina_list_next(node)) {
-        members.push_back(static_cast<Evas_Object*>(eina_list_data_get(node)));
-    }
-    return members;
-}
 
 /// Walks the objects of a canvas and gathers what they show. What neither is nor holds anything to name is left out.
 class ScreenReader {
@@ -75,10 +52,8 @@ public:
     std::vector<Element> read() {
         evas_smart_objects_calculate(canvas_);
         Element all;
-        for (Evas_Object* object = evas_object_bottom_get(canvas_); object; object = evas_object_above_get(object)) {
-            if (!evas_object_smart_parent_get(object)) {
-                readInto(all, object, true);
-            }
+        for (Evas_Object* object : topObjects(canvas_)) {
+            readInto(all, object, true);
         }
         return std::move(all.children);
     }

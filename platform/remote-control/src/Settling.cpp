@@ -1,6 +1,7 @@
 #include "Settling.h"
 
 #include "Guarded.h"
+#include "ScrollWatch.h"
 
 namespace remote_control {
 
@@ -11,7 +12,8 @@ constexpr double mostSeconds = 3;
 
 }  // namespace
 
-Settling::Settling(Evas* canvas, std::function<void()> done) : canvas_(canvas), done_(std::move(done)) {
+Settling::Settling(Evas* canvas, const ScrollWatch& scrolls, std::function<void()> done)
+    : canvas_(canvas), scrolls_(scrolls), done_(std::move(done)) {
     evas_event_callback_add(canvas_, EVAS_CALLBACK_RENDER_PRE, onFrameBegin, this);
     evas_event_callback_add(canvas_, EVAS_CALLBACK_RENDER_POST, onFrameEnd, this);
     evas_event_callback_add(canvas_, EVAS_CALLBACK_FREE, onCanvasFree, this);
@@ -93,7 +95,7 @@ Eina_Bool Settling::onQuiet(void* data) {
 Eina_Bool Settling::onIdle(void* data) {
     auto* self = static_cast<Settling*>(data);
     self->idle_ = nullptr;
-    if (self->drawing_) {
+    if (self->drawing_ || self->scrolls_.isScrolling()) {
         self->waitForQuiet();
     } else {
         self->finish();

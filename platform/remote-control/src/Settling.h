@@ -7,11 +7,15 @@
 
 namespace remote_control {
 
-/// Waits until a canvas has come to rest: no frame drawn for 0.15 s and nothing left to do, or 3 s have passed.
-/// Then calls `done` once, from the main loop. Destroyed before, or when the canvas goes, it calls nothing.
+class ScrollWatch;
+
+/// Waits until a canvas has come to rest: no frame drawn for 0.15 s, nothing left to do and nothing scrolling, or 3 s
+/// have passed. Then calls `done` once, from the main loop. Destroyed before, or when the canvas goes, it calls
+/// nothing.
 class Settling {
 public:
-    Settling(Evas* canvas, std::function<void()> done);
+    /// `scrolls` outlives this object.
+    Settling(Evas* canvas, const ScrollWatch& scrolls, std::function<void()> done);
     ~Settling();
     Settling(const Settling&) = delete;
     Settling& operator=(const Settling&) = delete;
@@ -28,6 +32,7 @@ private:
     void finish();
 
     Evas* canvas_;
+    const ScrollWatch& scrolls_;
     std::function<void()> done_;
     Ecore_Timer* quiet_ = nullptr;
     Ecore_Timer* deadline_ = nullptr;
