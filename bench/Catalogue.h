@@ -10,7 +10,7 @@ namespace bench {
 
 /// A device of its own with a catalogue of `menus` menus about ten applications, every file of the size and the
 /// make of those that ship: a page of five texts, translated by a string file with three languages.
-/// It is the process's device while it lives, and its files go with it.
+/// Its device is the process's from the start, until another one is; its files go with it.
 class Catalogue {
 public:
     explicit Catalogue(int menus);

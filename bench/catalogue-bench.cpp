@@ -7,6 +7,8 @@
 #include "RatioReport.h"
 
 #include <cstdio>
+#include <map>
+#include <memory>
 #include <stdexcept>
 
 namespace {
@@ -14,6 +16,22 @@ namespace {
 using bench::Catalogue;
 
 constexpr int sizes[] = {15, 150, 1500};
+
+std::map<std::int64_t, std::unique_ptr<Catalogue>>& catalogues() {
+    static std::map<std::int64_t, std::unique_ptr<Catalogue>> all;
+    return all;
+}
+
+/// The catalogue of that size, its device made the process's; built at the first call, kept for the next ones.
+Catalogue& catalogueOf(benchmark::State& state) {
+    std::unique_ptr<Catalogue>& catalogue = catalogues()[state.range(0)];
+    if (!catalogue) {
+        catalogue = std::make_unique<Catalogue>(static_cast<int>(state.range(0)));
+    } else {
+        catalogue->device().reopen();
+    }
+    return *catalogue;
+}
 
 /// Loads in full and checks that it was the whole catalogue.
 void loadAll(int menus) {
@@ -24,14 +42,14 @@ void loadAll(int menus) {
 }
 
 void FullLoad(benchmark::State& state) {
-    const Catalogue catalogue(static_cast<int>(state.range(0)));
+    catalogueOf(state);
     for ([[maybe_unused]] auto _ : state) {
         loadAll(static_cast<int>(state.range(0)));
     }
 }
 
 void CachedLoad(benchmark::State& state) {
-    const Catalogue catalogue(static_cast<int>(state.range(0)));
+    catalogueOf(state);
     loadAll(static_cast<int>(state.range(0)));
     for ([[maybe_unused]] auto _ : state) {
         KestContentMgr::getInstance()->loadContentsList(false);
@@ -39,17 +57,18 @@ void CachedLoad(benchmark::State& state) {
 }
 
 void BareParse(benchmark::State& state) {
-    const Catalogue catalogue(static_cast<int>(state.range(0)));
+    const Catalogue& catalogue = catalogueOf(state);
     for ([[maybe_unused]] auto _ : state) {
         bench::parseBare(catalogue.files());
     }
 }
 
 void BareParseAndWrites(benchmark::State& state) {
-    Catalogue catalogue(static_cast<int>(state.range(0)));
+    Catalogue& catalogue = catalogueOf(state);
     loadAll(static_cast<int>(state.range(0)));
     const auto values = catalogue.device()->preferences().all("com.ravella.kest");
-    bench::BareStore store(catalogue.device().folder() / "bare.db");
+    const support::TemporaryFolder folder;
+    bench::BareStore store(folder.path() / "bare.db");
     for ([[maybe_unused]] auto _ : state) {
         bench::parseBare(catalogue.files());
         store.write(values);
@@ -115,5 +134,6 @@ int main(int argc, char** argv) {
         printRatios(report);
     }
     benchmark::Shutdown();
+    catalogues().clear();
     return 0;
 }

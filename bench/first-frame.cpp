@@ -1,12 +1,12 @@
 // Loaded ahead of a program (LD_PRELOAD): writes to the file descriptor that FIRST_FRAME_FD names when the program has
 // drawn the first frame with a row of a list in it, and ends the program there.
 
+#include "FirstFrame.h"
+
 #include <Elementary.h>
 
 #include <cstdlib>
-#include <ctime>
 #include <dlfcn.h>
-#include <sys/resource.h>
 #include <unistd.h>
 
 namespace {
@@ -20,14 +20,9 @@ bool listHasRows() {
 }
 
 void tellAndEnd() {
-    struct {
-        timespec time;
-        long peakKilobytes;
-    } told{};
+    bench::FirstFrame told{};
     clock_gettime(CLOCK_MONOTONIC, &told.time);
-    rusage usage{};
-    getrusage(RUSAGE_SELF, &usage);
-    told.peakKilobytes = usage.ru_maxrss;
+    getrusage(RUSAGE_SELF, &told.usage);
     const char* descriptor = getenv("FIRST_FRAME_FD");
     const bool written = descriptor && write(atoi(descriptor), &told, sizeof told) == sizeof told;
     _exit(written ? 0 : 1);

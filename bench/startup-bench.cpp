@@ -2,6 +2,7 @@
 // to the first frame with rows in it, and the most memory up to there. Whole processes that draw into memory, in turn,
 // medians. Joins the bus of its environment as the application does: to be run under one of its own.
 
+#include "FirstFrame.h"
 #include "support/TemporaryFolder.h"
 
 #include <algorithm>
@@ -19,18 +20,18 @@
 
 namespace {
 
-struct FirstFrame {
-    timespec time;
-    long peakKilobytes;
-};
-
 struct Sample {
     double milliseconds;
+    double processorMilliseconds;
     double megabytes;
 };
 
 double milliseconds(const timespec& time) {
     return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_nsec) / 1e6;
+}
+
+double milliseconds(const timeval& time) {
+    return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_usec) / 1e3;
 }
 
 [[noreturn]] void become(const std::vector<std::string>& command, int told) {
@@ -62,7 +63,7 @@ Sample start(const std::vector<std::string>& command) {
         become(command, told[1]);
     }
     close(told[1]);
-    FirstFrame frame{};
+    bench::FirstFrame frame{};
     const bool read = ::read(told[0], &frame, sizeof frame) == sizeof frame;
     close(told[0]);
     int status = 0;
@@ -70,12 +71,9 @@ Sample start(const std::vector<std::string>& command) {
     if (!read) {
         throw std::runtime_error(command.front() + " ended before its first frame");
     }
-    return {milliseconds(frame.time) - milliseconds(begin), static_cast<double>(frame.peakKilobytes) / 1024};
-}
-
-double median(std::vector<double> values) {
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
+    return {milliseconds(frame.time) - milliseconds(begin),
+            milliseconds(frame.usage.ru_utime) + milliseconds(frame.usage.ru_stime),
+            static_cast<double>(frame.usage.ru_maxrss) / 1024};
 }
 
 struct Case {
@@ -84,19 +82,14 @@ struct Case {
     bool freshDevice;
     std::vector<Sample> samples;
 
-    double milliseconds() const {
+    double median(double Sample::*value) const {
         std::vector<double> all;
+        all.reserve(samples.size());
         for (const Sample& sample : samples) {
-            all.push_back(sample.milliseconds);
+            all.push_back(sample.*value);
         }
-        return median(all);
-    }
-    double megabytes() const {
-        std::vector<double> all;
-        for (const Sample& sample : samples) {
-            all.push_back(sample.megabytes);
-        }
-        return median(all);
+        std::sort(all.begin(), all.end());
+        return all[all.size() / 2];
     }
 };
 
@@ -114,11 +107,14 @@ void prepareEnvironment(const std::filesystem::path& folder) {
 }
 
 void print(const std::array<Case, 3>& cases) {
-    const Case& bare = cases[0];
-    std::printf("%-34s %10s %8s %10s %8s\n", "start to the first frame with rows", "ms", "ratio", "peak MB", "ratio");
+    std::printf("%-38s %8s %6s %14s %6s %8s %6s\n", "start to the first frame with rows", "ms", "ratio", "processor ms",
+                "ratio", "peak MB", "ratio");
     for (const Case& each : cases) {
-        std::printf("%-34s %10.1f %8.2f %10.1f %8.2f\n", each.name, each.milliseconds(),
-                    each.milliseconds() / bare.milliseconds(), each.megabytes(), each.megabytes() / bare.megabytes());
+        const auto value = [&](double Sample::*member) { return each.median(member); };
+        const auto ratio = [&](double Sample::*member) { return each.median(member) / cases[0].median(member); };
+        std::printf("%-38s %8.1f %6.2f %14.1f %6.2f %8.1f %6.2f\n", each.name, value(&Sample::milliseconds),
+                    ratio(&Sample::milliseconds), value(&Sample::processorMilliseconds),
+                    ratio(&Sample::processorMilliseconds), value(&Sample::megabytes), ratio(&Sample::megabytes));
     }
 }
 
