@@ -3,6 +3,7 @@
 #include "KestCommon.h"
 #include "KestContentMgr.h"
 #include "KestContentView.h"
+#include "KestFiles.h"
 #include "KestLog.h"
 #include "KestUsageLog.h"
 
@@ -168,7 +169,9 @@ Evas_Object* KestMainView::__getRowContent(void* data, Evas_Object* obj, const c
     fill(layout);
 
     Evas_Object* image = elm_image_add(layout);
-    elm_image_file_set(image, record->iconPath.c_str(), nullptr);
+    if (!KestFiles::isSpecial(record->iconPath)) {
+        elm_image_file_set(image, record->iconPath.c_str(), nullptr);
+    }
     fill(image);
     elm_object_part_content_set(layout, "elm.swallow.content", image);
     return layout;

@@ -1,6 +1,6 @@
 #include "KestXml.h"
 
-#include <sys/stat.h>
+#include "KestFiles.h"
 
 #include <map>
 
@@ -13,11 +13,6 @@ const size_t mostReferredText = 16 * 1024 * 1024;
 
 void freeText(xmlChar* text) {
     xmlFree(text);
-}
-
-bool isRegularFile(const std::string& path) {
-    struct stat status;
-    return stat(path.c_str(), &status) == 0 && S_ISREG(status.st_mode);
 }
 
 /// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand
@@ -83,7 +78,7 @@ void removeReferences(xmlNode* first) {
 }  // namespace
 
 KestXmlDocument::Result KestXmlDocument::read(const std::string& path) {
-    document_.reset(isRegularFile(path) ? xmlReadFile(path.c_str(), "utf-8", recoverFromErrors) : nullptr);
+    document_.reset(KestFiles::isRegular(path) ? xmlReadFile(path.c_str(), "utf-8", recoverFromErrors) : nullptr);
     if (!document_) {
         return Result::NotRead;
     }

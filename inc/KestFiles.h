@@ -1,0 +1,12 @@
+#pragma once
+
+#include <string>
+
+/// What the application asks of a file before it, or a library for it, opens it. Static; holds no state.
+class KestFiles {
+public:
+    /// False for a missing file too.
+    static bool isRegular(const std::string& path);
+    /// Something is there, but no regular file: opening a FIFO would wait for its writer.
+    static bool isSpecial(const std::string& path);
+};
