@@ -1,22 +1,9 @@
 #include "CatalogueTest.h"
 
 CatalogueTest::CatalogueTest(bool withManager) {
-    kept().reset();
-    kept() = std::make_unique<support::TemporaryDevice>(kest, "1.0.0");
     if (withManager)
         KestContentMgr::getInstance();
     kest_texts::start(device::keys::defaultLanguage);
-}
-
-std::unique_ptr<support::TemporaryDevice>& CatalogueTest::kept() {
-    // What the device needs to go must outlive the last one.
-    [[maybe_unused]] static const bool platformBegan = [] {
-        device::Device::setCurrent(nullptr);
-        device::faults::clear();
-        return true;
-    }();
-    static std::unique_ptr<support::TemporaryDevice> device;
-    return device;
 }
 
 void CatalogueTest::setLanguage(const std::string& language) {
@@ -26,24 +13,6 @@ void CatalogueTest::setLanguage(const std::string& language) {
 
 void CatalogueTest::setCountry(const std::string& country) {
     device()->settings().set(device::keys::country, country);
-}
-
-void CatalogueTest::writeMenus(const std::vector<kest_files::Menu>& menus) {
-    support::writeFile(mainMenuFile(), kest_files::mainMenu(menus));
-}
-
-void CatalogueTest::writeDetail(const std::string& item, const std::string& path, const std::string& appid) {
-    support::writeFile(resources(appid) / path, kest_files::detail(item));
-}
-
-void CatalogueTest::writeStrings(const std::vector<kest_files::String>& strings, const std::string& path,
-                                 const std::string& appid) {
-    support::writeFile(resources(appid) / path, kest_files::strings(strings));
-}
-
-void CatalogueTest::writeTip(const std::string& item) {
-    writeMenus({{}});
-    writeDetail(item);
 }
 
 std::vector<KestContentInfo> CatalogueTest::load(bool force) {

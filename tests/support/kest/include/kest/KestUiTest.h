@@ -19,7 +19,12 @@ class KestUiTest : public test_ui::UiTest, protected KestDevice {
 protected:
     /// The application of the test, with what the framework asks of it within reach.
     struct App : KestApp {
-        using KestApp::onAppControl;
+        bool takesRequests = true;  ///< false: launch requests come to nothing, so no view is pushed
+
+        void onAppControl(app_control_h request, bool firstLaunch) override {
+            if (takesRequests)
+                KestApp::onAppControl(request, firstLaunch);
+        }
         using KestApp::onCreate;
         using KestApp::onPause;
         using KestApp::onResume;

@@ -1,0 +1,143 @@
+#include "ListTest.h"
+
+#include "KestMainView.h"
+
+#include <device/Keys.h>
+
+using testing::AllOf;
+using testing::Contains;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+namespace {
+
+/// The list's view with what the framework asks of it within reach.
+struct View : KestMainView {
+    using KestMainView::KestMainView;
+    using KestMainView::onCreate;
+    using KestMainView::onPushToNaviframe;
+};
+
+/// A page of no interest.
+class OtherView : public app_assist::WView {
+public:
+    const char* getClassName() const override { return "OtherView"; }
+
+protected:
+    Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_button_add(parent); }
+};
+
+}  // namespace
+
+class Life : public ListTest {
+protected:
+    /// The application without its first view.
+    void startEmpty() {
+        app_.takesRequests = false;
+        running_.emplace(app_);
+        newLog();
+    }
+};
+
+TEST_F(Life, BeginsWithTheThemesFileAndNoRows) {
+    startEmpty();
+    calls::made().themeExtensions.clear();
+    const View view(true);
+    EXPECT_THAT(calls::made().themeExtensions, ElementsAre((device().appRoot() / "res/edje/kest.edj").string()));
+    EXPECT_THAT(calls::made().rows, IsEmpty());
+    EXPECT_EQ(view.getEvasObj(), nullptr);
+}
+
+TEST_F(Life, AddsTheThemesFileOnceForTwoViews) {
+    startEmpty();
+    const View first(true), second(true);
+    const Eina_List* all = elm_theme_extension_list_get(nullptr);
+    EXPECT_EQ(eina_list_count(all), 1U);
+}
+
+TEST_F(Life, RegistersAndTakesBackItsCallbacks) {
+    writeTips({"A"});
+    start();
+    EXPECT_THAT(calls::made().registrations, ElementsAre("theme +", "package create", "package set"));
+    calls::made().registrations.clear();
+    running_.reset();
+    EXPECT_THAT(calls::made().registrations, ElementsAre("theme -", "package unset", "package destroy"));
+}
+
+TEST_F(Life, ItsEndIsFollowedByNothing) {
+    writeTips({"A"});
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    naviframe().push(new KestMainView(true), nullptr, nullptr);
+    settle();
+    elm_naviframe_item_pop(naviframe().getEvasObj());
+    settle();
+    ASSERT_EQ(topView(), "OtherView");
+    newLog();
+    device()->settings().set(device::keys::theme, "dark");
+    device()->events().publishPackage(
+        {"com.example.other", device::PackageEvent::Type::Install, device::PackageEvent::State::Completed, 100, 0});
+    settle();
+    EXPECT_THAT(newLog(), IsEmpty());
+    EXPECT_EQ(topView(), "OtherView");
+}
+
+TEST_F(Life, WorksWithoutThePackageManager) {
+    writeTips({"A"});
+    device::faults::plan("package_manager_create", -5);
+    device::faults::plan("package_manager_set_event_cb", -5);
+    start();
+    EXPECT_EQ(test_ui::rows(list()).size(), 2U);
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+TEST_F(Life, GoesOnTopWhenItIsPushedSo) {
+    writeTips({"A"});
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    naviframe().push(new KestMainView(true), nullptr, nullptr);
+    EXPECT_EQ(topView(), "KestMainView");
+}
+
+TEST_F(Life, SlidesInBeneathWhenItIsPushedSo) {
+    writeTips({"A"});
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    auto* view = new KestMainView(false);
+    naviframe().push(view, nullptr, nullptr);
+    EXPECT_EQ(topView(), "OtherView");
+    Elm_Object_Item* bottom = elm_naviframe_bottom_item_get(naviframe().getEvasObj());
+    EXPECT_EQ(elm_object_item_part_content_get(bottom, nullptr), view->getEvasObj());
+    EXPECT_EQ(view->getNaviItem(), bottom);
+    EXPECT_EQ(text(bottom, "elm.text.title"), "Tips");
+    elm_naviframe_item_pop(naviframe().getEvasObj());
+    settle();
+    EXPECT_EQ(topView(), "KestMainView");
+    EXPECT_EQ(test_ui::rows(list()).size(), 2U);
+}
+
+TEST_F(Life, EndsWithoutAParent) {
+    startEmpty();
+    EXPECT_DEATH(
+        View(true).onCreate(nullptr, nullptr),
+        AllOf(HasSubstr("KestMainView.cpp:"), HasSubstr("__createGenlist: Assertion `(parent != __null)' failed.")));
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("__createGenlist", "WASSERT! __parent is null.")));
+}
+
+TEST_F(Life, EndsWithoutAList) {
+    startEmpty();
+    calls::made().failGenlist = true;
+    EXPECT_DEATH(
+        View(true).onCreate(running().window(), nullptr),
+        AllOf(HasSubstr("KestMainView.cpp:"), HasSubstr("__createGenlist: Assertion `(__genlist != __null)' failed.")));
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("__createGenlist", "WASSERT! genlist is not created.")));
+}
+
+TEST_F(Life, EndsWhenItIsPushedBeforeItWasMade) {
+    startEmpty();
+    EXPECT_DEATH(View(true).onPushToNaviframe(naviframe().getEvasObj()),
+                 AllOf(HasSubstr("KestMainView.cpp:"),
+                       HasSubstr("onPushToNaviframe: Assertion `(getEvasObj() != nullptr)' failed.")));
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("onPushToNaviframe", "WASSERT! getEvasObj() != nullptr")));
+}
