@@ -12,7 +12,8 @@ class Bus;
 /// Calls the methods of one object on the device's bus and waits for the answers, without a main loop.
 /// Nothing else is dispatched meanwhile, so an object of this process must not be called this way.
 /// All calls throw Error: with the message of the D-Bus error that came back; "<destination> is not running";
-/// "<destination> did not answer within <seconds> s"; "<destination> ended before it answered"; or what is wrong with an argument (a text that is not UTF-8).
+/// "<destination> did not answer within <seconds> s"; "<destination> ended before it answered"; or what is wrong with
+/// an argument (a text that is not UTF-8).
 class BusCall {
 public:
     using Argument = std::variant<std::string, int, double, bool>;  ///< D-Bus types s, i, d, b
