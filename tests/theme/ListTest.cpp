@@ -98,13 +98,27 @@ TEST_F(List, IsMirroredWhereOneReadsFromRightToLeft) {
 TEST_F(List, ShowsAThumbWhileItMovesOnly) {
     start();
     pushList(std::vector<Row>(30, {"Phone", "Answer calls"}));
-    const Rect edge{704, 112, 14, 1168};
+    const Rect edge{704, 120, 14, 1160};
     EXPECT_EQ(1, screen().picture().colours(edge));
     screen().swipe({300, 1000}, {300, 600}, 0.3);
     test_ui::runFor(0.05);
     EXPECT_GT(screen().picture().colours(edge), 1);
     test_ui::runFor(5);
     EXPECT_EQ(1, screen().picture().colours(edge));
+}
+
+TEST_F(List, ShowsAHairlineBelowTheTitleBarWhileThereIsMoreAbove) {
+    start();
+    pushList(std::vector<Row>(30, {"Phone", "Answer calls"}));
+    EXPECT_EQ(lightPage, screen().picture().pixel(5, 112));
+    screen().swipe({300, 1000}, {300, 600}, 0.3);
+    test_ui::runFor(5);
+    EXPECT_EQ(0xDDE1E7u, screen().picture().pixel(5, 112));
+    for (int flick = 0; flick < 5; ++flick) {
+        screen().swipe({300, 300}, {300, 1200});
+        test_ui::runFor(3);
+    }
+    EXPECT_EQ(lightPage, screen().picture().pixel(5, 112));
 }
 
 TEST_F(List, RingsTheRowThatHasTheFocusOfTheKeys) {
