@@ -1,5 +1,5 @@
 // The least that an EFL program with a list does: a window of the device's size, in it a list with rows of the default
-// style, a picture and a text each. Argument: the picture. What start-up is compared with.
+// style, a picture and a text each. Arguments: the pictures, in turn. What start-up is compared with.
 
 #include <Efreet.h>
 #include <Elementary.h>
@@ -12,16 +12,19 @@ constexpr int width = 720;
 constexpr int height = 1280;
 constexpr int rows = 12;
 
+/// The pictures' paths.
+const char* const* pictures;
+int pictureCount;
+
 char* rowText(void*, Evas_Object*, const char* part) {
     return std::strcmp(part, "elm.text") == 0 ? strdup("What a row has to say") : nullptr;
 }
 
-const char* picture;
-
-Evas_Object* rowContent(void*, Evas_Object* list, const char* part) {
+Evas_Object* rowContent(void* data, Evas_Object* list, const char* part) {
     if (std::strcmp(part, "elm.swallow.icon") != 0) {
         return nullptr;
     }
+    const char* picture = pictures[*static_cast<int*>(data) % pictureCount];
     Evas_Object* image = elm_image_add(list);
     elm_image_file_set(image, picture, nullptr);
     evas_object_size_hint_aspect_set(image, EVAS_ASPECT_CONTROL_VERTICAL, 1, 1);
@@ -31,7 +34,11 @@ Evas_Object* rowContent(void*, Evas_Object* list, const char* part) {
 }  // namespace
 
 int main(int argc, char** argv) {
-    picture = argc > 1 ? argv[1] : "";
+    if (argc < 2) {
+        return 1;
+    }
+    pictures = argv + 1;
+    pictureCount = argc - 1;
     ecore_app_no_system_modules();
     efreet_cache_disable();
     elm_init(argc, argv);
@@ -50,8 +57,10 @@ int main(int argc, char** argv) {
     row.item_style = "default";
     row.func.text_get = rowText;
     row.func.content_get = rowContent;
+    static int indices[rows];
     for (int i = 0; i < rows; ++i) {
-        elm_genlist_item_append(list, &row, nullptr, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
+        indices[i] = i;
+        elm_genlist_item_append(list, &row, &indices[i], nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
     }
     evas_object_show(list);
     evas_object_resize(window, width, height);

@@ -5,11 +5,12 @@ say() {
     printf '%s\n' "$*"
 }
 
-# fail MESSAGE [WHAT TO DO]: says both on standard error and ends the command.
+# fail MESSAGE [WHAT TO DO...]: says them on standard error, one a line, and ends the command.
 fail() {
     printf '%s: error: %s\n' "${0##*/}" "$1" >&2
-    if (($# > 1)); then
-        printf '%s\n' "$2" >&2
+    shift
+    if (($#)); then
+        printf '%s\n' "$@" >&2
     fi
     exit 1
 }
