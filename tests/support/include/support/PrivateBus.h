@@ -8,6 +8,7 @@
 #include <Ecore.h>
 
 #include <chrono>
+#include <csignal>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -32,6 +33,8 @@ inline Process processOnTheBus(const std::function<int()>& work) {
 inline bool runLoopUntil(const std::function<bool()>& done,
                          std::chrono::milliseconds patience = std::chrono::seconds(20)) {
     device::startMainLoop();
+    // Ecore's own handler takes the ends of all child processes, also of those that a test waits for.
+    std::signal(SIGCHLD, SIG_DFL);
     const auto end = std::chrono::steady_clock::now() + patience;
     // The loop may wait for something that never comes; it wakes up now and then to look at the time.
     Ecore_Timer* waking = ecore_timer_add(

@@ -65,14 +65,14 @@ public:
         if (id_ <= 0)
             return;
         kill(id_, signalNumber);
-        wait();
+        waitpid(std::exchange(id_, 0), nullptr, 0);
     }
-    /// Waits for the end: the exit status, or the negative number of the signal that ended it.
+    /// Waits for the end: the exit status, or the negative number of the signal that ended it. Throws when somebody
+    /// else has waited for it, as Ecore's handler of SIGCHLD does (see runLoopUntil() in PrivateBus.h).
     int wait() {
         int status = 0;
-        const pid_t waited = waitpid(std::exchange(id_, 0), &status, 0);
-        if (waited < 0)
-            return 99;
+        if (waitpid(std::exchange(id_, 0), &status, 0) < 0)
+            throw std::runtime_error("the end of a child process was taken by somebody else");
         return WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status);
     }
 
