@@ -83,7 +83,7 @@ const std::map<std::string, Layer>& layers() {
         {"efl-answers", {{"device"}, true}},
         {"ui-extension", {{"device", "capi", "log-client"}, true}},
         {"remote-control", {{"device", "capi", "log-client"}, true}},
-        {"app-assist", {{"device", "capi", "log-client", "ui-extension", "remote-control"}, true}},
+        {"app-assist", {{"device", "capi", "log-client", "efl-answers", "ui-extension", "remote-control"}, true}},
     };
     return all;
 }
