@@ -91,6 +91,27 @@ TEST_F(Application, LivesInOrder) {
     EXPECT_THAT(app_.story, ElementsAre("onPause", "onTerminate"));
 }
 
+TEST_F(Application, IsToldWhenItsWindowIsPutAwayAndComesBack) {
+    app_.inCreate = [this] { app_.attachWindow(new app_assist::WWindow("Sample", ELM_WIN_BASIC)); };
+    RunningApp running(app_);
+    test_ui::runFor(1.0);
+    app_.story.clear();
+    evas_object_smart_callback_call(running.window(), "iconified", nullptr);
+    EXPECT_THAT(std::exchange(app_.story, {}), ElementsAre("onPause"));
+    evas_object_smart_callback_call(running.window(), "normal", nullptr);
+    EXPECT_THAT(std::exchange(app_.story, {}), ElementsAre("onResume"));
+    evas_object_smart_callback_call(running.window(), "iconified", nullptr);
+    running.end();
+    EXPECT_THAT(app_.story, ElementsAre("onPause", "onTerminate"));
+}
+
+TEST_F(Application, AWindowOfTheFrameworksMakingShows) {
+    app_.inCreate = [this] { app_.attachWindow(new app_assist::WWindow("Sample", ELM_WIN_BASIC)); };
+    RunningApp running(app_);
+    test_ui::runFor(1.0);
+    EXPECT_TRUE(evas_object_visible_get(running.window()));
+}
+
 TEST_F(Application, TheObjectIsTheProcesssForItsLife) {
     EXPECT_EQ(&app_, WApp::getInstance());
     {

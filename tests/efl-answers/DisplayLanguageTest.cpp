@@ -9,8 +9,16 @@
 #include <locale.h>
 
 #include <filesystem>
+#include <ostream>
+#include <string>
+#include <vector>
 
 namespace fs = std::filesystem;
+
+/// The C library takes LOCPATH apart anew for every locale and keeps the parts.
+extern "C" const char* __lsan_default_suppressions() {
+    return "leak:__argz_add_sep\n";
+}
 
 namespace {
 
@@ -38,6 +46,10 @@ struct Workstation {
     std::vector<std::string> locales;
     const char* koreanLocale;
 };
+
+void PrintTo(const Workstation& workstation, std::ostream* out) {
+    *out << workstation.what;
+}
 
 class DisplayLanguageOn : public testing::TestWithParam<Workstation> {
 protected:

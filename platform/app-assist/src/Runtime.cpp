@@ -143,7 +143,7 @@ void Runtime::deliver(const LaunchRequest::Extras& extras) {
     const bool first = std::exchange(firstLaunch_, false);
     app_.onAppControl(request.handle(), first);
     if (first)
-        app_.onResume();
+        app_.setInSight(true);
 }
 
 void Runtime::followDevice() {
@@ -172,8 +172,7 @@ void Runtime::useTheme() const {
 void Runtime::end() {
     if (firstRequest_)
         ecore_job_del(std::exchange(firstRequest_, nullptr));
-    if (!firstLaunch_)
-        guarded("onPause", [this] { app_.onPause(); });
+    app_.setInSight(false);
     if (std::exchange(created_, false))
         guarded("onTerminate", [this] { app_.onTerminate(); });
     settings_.reset();

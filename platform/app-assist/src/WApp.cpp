@@ -1,7 +1,10 @@
 #include "app-assist/WApp.h"
 
+#include "Guarded.h"
 #include "Runtime.h"
 #include "app-assist/WWindow.h"
+
+#include <utility>
 
 namespace app_assist {
 
@@ -34,8 +37,23 @@ int WApp::start(int argc, char** argv) {
 
 void WApp::attachWindow(WWindow* window) {
     window_.reset(window);
-    if (window)
-        window->create();
+    if (!window)
+        return;
+    window->create();
+    if (!window->getEvasObj())
+        return;
+    evas_object_smart_callback_add(
+        window->getEvasObj(), "iconified",
+        [](void* app, Evas_Object*, void*) { static_cast<WApp*>(app)->setInSight(false); }, this);
+    evas_object_smart_callback_add(
+        window->getEvasObj(), "normal",
+        [](void* app, Evas_Object*, void*) { static_cast<WApp*>(app)->setInSight(true); }, this);
+}
+
+void WApp::setInSight(bool inSight) {
+    if (std::exchange(inSight_, inSight) == inSight)
+        return;
+    guarded("onResume or onPause", [&] { inSight ? onResume() : onPause(); });
 }
 
 WWindow* WApp::getWindow() const {

@@ -27,12 +27,7 @@ void WWindow::setOnCreateWin(std::function<Evas_Object*()> onCreateWin) {
 }
 
 void WWindow::create() {
-    if (onCreateWin_) {
-        window_ = onCreateWin_();
-    } else {
-        window_ = elm_win_add(nullptr, getName(), type_);
-        evas_object_show(window_);
-    }
+    window_ = onCreateWin_ ? onCreateWin_() : elm_win_add(nullptr, getName(), type_);
     if (!window_) {
         dlog_print(DLOG_ERROR, logTag, "the window %s could not be made", getName());
         return;
@@ -42,6 +37,8 @@ void WWindow::create() {
     evas_object_event_callback_add(window_, EVAS_CALLBACK_RESIZE, resized, this);
     evas_object_smart_callback_add(
         window_, "delete,request", [](void*, Evas_Object*, void*) { elm_exit(); }, nullptr);
+    if (!onCreateWin_)
+        evas_object_show(window_);
 }
 
 void WWindow::evasObjectGoes(void* data, Evas*, Evas_Object*, void*) {

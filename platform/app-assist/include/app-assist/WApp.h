@@ -46,7 +46,10 @@ protected:
 
 private:
     friend class Runtime;
+    void setInSight(bool inSight);
+
     std::unique_ptr<WWindow> window_;
+    bool inSight_ = false;
 };
 
 }  // namespace app_assist
