@@ -15,7 +15,8 @@ public:
         Empty     ///< no root element, or a root without children
     };
 
-    /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened. References to
+    /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened, nor one that is
+    /// compressed or larger than 64 MiB. References to
     /// entities that the file declares are left out when they stand for more text than any catalogue has.
     Result read(const std::string& path);
 

@@ -34,8 +34,9 @@ const char* failureOf(KestXmlDocument::Result result) {
     return nullptr;
 }
 
-bool hasTranslation(const char* domain, const std::string& id) {
-    return id != dgettext(domain, id.c_str());
+/// A domain is a file's name for gettext: one with a slash would lead it anywhere.
+bool hasTranslation(const std::string& domain, const std::string& id) {
+    return domain.find('/') == std::string::npos && id != dgettext(domain.c_str(), id.c_str());
 }
 
 std::string detailPath(const KestContentInfo& record) {
@@ -275,7 +276,7 @@ bool KestContentMgr::__isStringAvailable(const std::string& id, const std::strin
     if (id.empty()) {
         return false;
     }
-    if (hasTranslation(domain.c_str(), id) || hasTranslation(ownDomain, id) || hasTranslation(systemDomain, id)) {
+    if (hasTranslation(domain, id) || hasTranslation(ownDomain, id) || hasTranslation(systemDomain, id)) {
         return true;
     }
     return __findInStringTable(id) != nullptr;
@@ -302,7 +303,7 @@ std::string KestContentMgr::__getString(const std::string& id, const std::string
         return dgettext(ownDomain, id.c_str());
     }
     bindtextdomain(domain.c_str(), kest_paths::systemLocale);
-    if (hasTranslation(domain.c_str(), id)) {
+    if (hasTranslation(domain, id)) {
         return dgettext(domain.c_str(), id.c_str());
     }
     if (hasTranslation(systemDomain, id)) {

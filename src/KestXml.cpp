@@ -15,6 +15,22 @@ void freeText(xmlChar* text) {
     xmlFree(text);
 }
 
+/// Files that are larger take more memory, parsed, than a device has.
+const std::uintmax_t largestFile = 64 * 1024 * 1024;
+
+/// The parser would unpack it, to any size.
+bool isCompressed(const std::string& path) {
+    const std::string gzip = "\x1f\x8b";
+    const std::string xz = "\xfd"
+                           "7zXZ";
+    const std::string begin = KestFiles::readBegin(path, xz.size());
+    return begin == xz || begin.compare(0, gzip.size(), gzip) == 0;
+}
+
+bool isReadable(const std::string& path) {
+    return KestFiles::isRegular(path) && KestFiles::size(path) <= largestFile && !isCompressed(path);
+}
+
 /// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand
 /// for gigabytes, which the parser does not notice while it only refers to them.
 class ReferredText {
@@ -78,7 +94,7 @@ void removeReferences(xmlNode* first) {
 }  // namespace
 
 KestXmlDocument::Result KestXmlDocument::read(const std::string& path) {
-    document_.reset(KestFiles::isRegular(path) ? xmlReadFile(path.c_str(), "utf-8", recoverFromErrors) : nullptr);
+    document_.reset(isReadable(path) ? xmlReadFile(path.c_str(), "utf-8", recoverFromErrors) : nullptr);
     if (!document_) {
         return Result::NotRead;
     }

@@ -2,6 +2,8 @@
 
 #include <unistd.h>
 
+#include <fstream>
+
 using namespace manager_log;
 using kest_files::contents;
 using kest_files::detail;
@@ -46,7 +48,9 @@ protected:
             if (geteuid() == 0) {
                 for (const fs::path& folder : {device.folder(), device.root()})
                     fs::permissions(folder, fs::perms::all);
-                fs::permissions(device::Folder(device.root()).log(), fs::perms::all);
+                const fs::path log = device::Folder(device.root()).log();
+                std::ofstream(log, std::ios::app).flush();
+                fs::permissions(log, fs::perms::all);
                 constexpr uid_t nobody = 65534;
                 became_ = seteuid(nobody) == 0;
             }
@@ -229,6 +233,39 @@ TEST_F(HostileFile, MayBeginWithAByteOrderMark) {
     support::writeFile(detailFile(), "\xef\xbb\xbf" + detail("<title>Title</title>"));
     // The parser does not take the mark where it is told the encoding.
     EXPECT_EQ(load().size(), 1U);
+}
+
+TEST_F(HostileFile, MayBeCompressedAndIsNotUnpacked) {
+    // "<tip><items><item><title>Title</title></item></items></tip>" as gzip and as xz.
+    const std::vector<std::string> compressed = {
+        "1f8b0800000000000003b329c92cb0b3c92c49cd2d8650763625992539a9762120d2461fc2b1d18748e94315ea83740100cdb97f413b00"
+        "00"
+        "00",
+        "fd377a585a0000016922de360200210116000000742fe5a3e0003a00275d001e1d0927322065fdb23ba833d6710356fa1bba587cf30b01"
+        "22"
+        "3a23def233c134598450a28400000000cdb97f4100013f3b337653c99042990d010000000001595a"};
+    for (const std::string& hex : compressed) {
+        std::string bytes;
+        for (std::size_t i = 0; i < hex.size(); i += 2)
+            bytes += static_cast<char>(std::stoi(hex.substr(i, 2), nullptr, 16));
+        support::writeFile(detailFile(), bytes);
+        expectNoDetail();
+    }
+}
+
+TEST_F(HostileFile, MayBeLargerThanADevicesMemory) {
+    support::writeFile(detailFile(), detail("<title>Title</title>") + std::string(65 << 20, '\n'));
+    expectNoDetail();
+}
+
+TEST_F(HostileFile, TextsDomainMayLeadToAFifo) {
+    const std::filesystem::path fifo = device().folder() / "pipe";
+    makeFifo(fifo.string() + ".mo");
+    const std::string domain = repeated("../", 30) + fifo.relative_path().string();
+    EXPECT_EQ(loadTip("<textdomain>" + domain + "</textdomain><title id=\"IDS_X\">x</title>" +
+                      contents(kest_files::textTag("IDS_X") + kest_files::textTag("IDS_SYSTEM")))
+                  .textContents,
+              "IDS_XSystem text");
 }
 
 TEST_F(HostileFile, MayBeFullOfErrors) {
