@@ -3,6 +3,9 @@
 #include "Objects.h"
 
 #include <Elementary.h>
+#include <Eo.h>
+
+#include <algorithm>
 
 namespace remote_control {
 
@@ -14,49 +17,41 @@ constexpr char stopped[] = "scroll,anim,stop";
 }  // namespace
 
 ScrollWatch::ScrollWatch(Evas* canvas) {
-    visitWidgets(canvas, [this](Evas_Object* widget) { watch(widget); });
+    visitWidgets(canvas, [this](Evas_Object* widget) {
+        Watched& watched = widgets_.emplace_back();
+        // Told by the object itself: a widget within one that is deleted does not always say so.
+        efl_wref_add(widget, &watched.widget);
+        evas_object_smart_callback_add(widget, started, onStart, &watched);
+        evas_object_smart_callback_add(widget, stopped, onStop, &watched);
+    });
 }
 
 ScrollWatch::~ScrollWatch() {
-    while (!watched_.empty()) {
-        forget(*watched_.begin());
+    for (Watched& watched : widgets_) {
+        if (watched.widget) {
+            evas_object_smart_callback_del_full(watched.widget, started, onStart, &watched);
+            evas_object_smart_callback_del_full(watched.widget, stopped, onStop, &watched);
+            efl_wref_del(watched.widget, &watched.widget);
+        }
     }
 }
 
 bool ScrollWatch::isScrolling() const {
-    return !watched_.empty() && (!scrolling_.empty() || ecore_loop_time_get() < momentumEnd_);
+    const double now = ecore_loop_time_get();
+    return std::any_of(widgets_.begin(), widgets_.end(), [now](const Watched& watched) {
+        return watched.widget && (watched.scrolling || now < watched.momentumEnd);
+    });
 }
 
-void ScrollWatch::watch(Evas_Object* widget) {
-    evas_object_smart_callback_add(widget, started, onStart, this);
-    evas_object_smart_callback_add(widget, stopped, onStop, this);
-    evas_object_event_callback_add(widget, EVAS_CALLBACK_DEL, onDelete, this);
-    watched_.insert(widget);
-}
-
-void ScrollWatch::forget(Evas_Object* widget) {
-    evas_object_smart_callback_del_full(widget, started, onStart, this);
-    evas_object_smart_callback_del_full(widget, stopped, onStop, this);
-    evas_object_event_callback_del_full(widget, EVAS_CALLBACK_DEL, onDelete, this);
-    watched_.erase(widget);
-    if (scrolling_.erase(widget) > 0 && scrolling_.empty()) {
-        momentumEnd_ = 0;
-    }
-}
-
-void ScrollWatch::onStart(void* data, Evas_Object* widget, void*) {
-    auto* self = static_cast<ScrollWatch*>(data);
-    self->scrolling_.insert(widget);
+void ScrollWatch::onStart(void* data, Evas_Object*, void*) {
+    auto* watched = static_cast<Watched*>(data);
+    watched->scrolling = true;
     // At the end of a list the toolkit says that the scrolling has stopped, and keeps its momentum for this time.
-    self->momentumEnd_ = ecore_loop_time_get() + elm_config_scroll_thumbscroll_friction_get();
+    watched->momentumEnd = ecore_loop_time_get() + elm_config_scroll_thumbscroll_friction_get();
 }
 
-void ScrollWatch::onStop(void* data, Evas_Object* widget, void*) {
-    static_cast<ScrollWatch*>(data)->scrolling_.erase(widget);
-}
-
-void ScrollWatch::onDelete(void* data, Evas*, Evas_Object* widget, void*) {
-    static_cast<ScrollWatch*>(data)->forget(widget);
+void ScrollWatch::onStop(void* data, Evas_Object*, void*) {
+    static_cast<Watched*>(data)->scrolling = false;
 }
 
 }  // namespace remote_control

@@ -2,7 +2,7 @@
 
 #include <Evas.h>
 
-#include <set>
+#include <list>
 
 namespace remote_control {
 
@@ -19,15 +19,16 @@ public:
     bool isScrolling() const;
 
 private:
+    struct Watched {
+        Evas_Object* widget = nullptr;  ///< set to null by the toolkit when the widget has gone
+        bool scrolling = false;
+        double momentumEnd = 0;
+    };
+
     static void onStart(void* data, Evas_Object* widget, void* info);
     static void onStop(void* data, Evas_Object* widget, void* info);
-    static void onDelete(void* data, Evas* canvas, Evas_Object* widget, void* info);
-    void watch(Evas_Object* widget);
-    void forget(Evas_Object* widget);
 
-    std::set<Evas_Object*> watched_;
-    std::set<Evas_Object*> scrolling_;
-    double momentumEnd_ = 0;
+    std::list<Watched> widgets_;
 };
 
 }  // namespace remote_control

@@ -1,0 +1,135 @@
+#include "ProgramTest.h"
+
+using testing::Contains;
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::Not;
+using testing::SizeIs;
+
+namespace {
+
+class TipsList : public ProgramTest {};
+
+}  // namespace
+
+TEST_F(TipsList, ShowsATitleRowAndARowForEachMenuOfTheRegion) {
+    start();
+
+    EXPECT_EQ(titleBar(), "Tips");
+    EXPECT_EQ(titleRow(), "Tips and guidelines");
+    ASSERT_THAT(rows(), SizeIs(menusOfferedIn("Global").size()));
+    for (const ListRow& row : rows()) {
+        EXPECT_NE(row.top, "");
+        EXPECT_NE(row.bottom, "");
+        EXPECT_NE(row.bottom, "No Title");
+    }
+}
+
+TEST_F(TipsList, TheRowsInSightHaveTheIconsOfTheirApplications) {
+    start();
+
+    const std::vector<ListRow> shown = rows();
+    ASSERT_GE(shown.size(), 6U);
+    for (std::size_t i = 0; i < 6; ++i) {
+        EXPECT_TRUE(shown[i].hasIcon) << shown[i].bottom;
+    }
+}
+
+TEST_F(TipsList, AnotherCountryAndARestartChangeWhichMenusShow) {
+    start();
+    const std::vector<std::string> global = titles();
+    EXPECT_THAT(global, SizeIs(menusOfferedIn("Global").size()));
+
+    device_.must({"set", "country", "IN"});
+    EXPECT_EQ(titles(), global) << "a running list keeps its menus";
+    restart();
+
+    EXPECT_THAT(titles(), SizeIs(menusOfferedIn("India").size()));
+    EXPECT_THAT(titles(), Not(Contains("")));
+    EXPECT_NE(titles(), global);
+}
+
+TEST_F(TipsList, AnotherLanguageIsOnTheRunningListWhenTheCommandComesBack) {
+    start();
+    const std::vector<std::string> english = titles();
+
+    device_.must({"set", "language", "ko_KR"});
+
+    EXPECT_EQ(titleBar(), "팁");
+    EXPECT_EQ(titleRow(), "팁과 사용 안내");
+    const std::vector<std::string> korean = titles();
+    ASSERT_THAT(korean, SizeIs(english.size()));
+    for (std::size_t i = 0; i < english.size(); ++i) {
+        EXPECT_NE(korean[i], english[i]);
+    }
+
+    device_.must({"set", "language", "en_US"});
+    EXPECT_EQ(titles(), english);
+}
+
+TEST_F(TipsList, StartsInTheDevicesLanguage) {
+    device_.must({"set", "language", "ru_RU"});
+    start();
+
+    EXPECT_EQ(titleBar(), "Советы");
+    EXPECT_EQ(device_.json({"preferences", app})[app]["KestCurrentLanguage"], "ru_RU.UTF-8");
+}
+
+TEST_F(TipsList, AnInstalledApplicationBringsItsTipAndTakesItAwayAgain) {
+    start();
+    const std::vector<std::string> before = titles();
+
+    device_.must({"install", makeSleepPackage(device_.folder() / "sleep")});
+    std::vector<std::string> with = before;
+    with.push_back("Sleep tight");
+    EXPECT_EQ(titles(), with);
+
+    device_.must({"uninstall", "com.ravella.sleep"});
+    EXPECT_EQ(titles(), before);
+}
+
+TEST_F(TipsList, AnUpdateOfAnApplicationChangesNothing) {
+    device_.must({"install", makeSleepPackage(device_.folder() / "sleep")});
+    start();
+    const std::vector<std::string> before = titles();
+
+    const std::filesystem::path update = makeSleepPackage(device_.folder() / "update");
+    std::filesystem::remove(update / "shared/res/contents/sleep_night.xml");
+    EXPECT_EQ(device_.must({"install", update}), "updated com.ravella.sleep 1.0\n");
+
+    EXPECT_EQ(titles(), before);
+}
+
+TEST_F(TipsList, AThemeChangesItsColours) {
+    start();
+    device_.must({"screenshot", "light.png"});
+
+    device_.must({"set", "theme", "dark"});
+
+    device_.must({"screenshot", "dark.png"});
+    EXPECT_NE(support::readFile(device_.folder() / "light.png"), support::readFile(device_.folder() / "dark.png"));
+    EXPECT_THAT(titles(), SizeIs(menusOfferedIn("Global").size()));
+}
+
+TEST_F(TipsList, FitsTheSmallScreen) {
+    device_.must({"start", "--headless", "--screen", "480x800"});
+
+    const nlohmann::json shown = list();
+    EXPECT_EQ(shown["width"], 480);
+    EXPECT_THAT(shown["rows"], SizeIs(menusOfferedIn("Global").size() + 1));
+}
+
+TEST_F(TipsList, ALaterStartUsesTheCacheUntilItIsCleared) {
+    start();
+    const std::vector<std::string> first = titles();
+    EXPECT_THAT(logged("Language changed"), IsEmpty()) << "there was no language to compare with";
+    restart();
+    EXPECT_EQ(titles(), first);
+
+    device_.must({"stop"});
+    EXPECT_NE(device_.json({"preferences", app})[app], nlohmann::json::object());
+    device_.must({"clear", app});
+    EXPECT_EQ(device_.json({"preferences", app})[app], nlohmann::json::object());
+    start();
+    EXPECT_EQ(titles(), first);
+}
