@@ -1,74 +1,24 @@
+#include "TellingApp.h"
+
 #include "support/Environment.h"
 #include "support/TemporaryDevice.h"
 #include "ui/RunningApp.h"
 #include "ui/UiTest.h"
 
-#include <LaunchRequest.h>
-#include <app-assist/WApp.h>
-#include <app-assist/WAppEventHandler.h>
 #include <app-assist/WWindow.h>
 #include <device/Keys.h>
 #include <gmock/gmock.h>
 #include <libintl.h>
-#include <ui_extension.h>
 
 #include <cstdlib>
-#include <fstream>
 #include <utility>
 
-#include <unistd.h>
-
 using app_assist::WApp;
-using app_assist::WAppEventHandler;
 using test_ui::RunningApp;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
 namespace {
-
-using Story = std::vector<std::string>;
-
-/// An application that tells what the framework asks of it.
-class TellingApp : public WApp {
-public:
-    Story story;
-    bool creates = true;
-    std::function<void()> inCreate, inAppControl;
-
-protected:
-    void onStart(int argc, char** argv) override { tell("onStart " + std::to_string(argc) + " " + argv[argc - 1]); }
-    bool onCreate() override {
-        tell("onCreate");
-        if (inCreate)
-            inCreate();
-        return creates;
-    }
-    void onTerminate() override { tell("onTerminate"); }
-    void onPause() override { tell("onPause"); }
-    void onResume() override { tell("onResume"); }
-    void onAppControl(app_control_h request, bool firstLaunch) override {
-        char* id = nullptr;
-        app_control_get_app_id(request, &id);
-        std::string line = std::string("onAppControl ") + id + (firstLaunch ? " first" : " again");
-        std::free(id);
-        app_control_foreach_extra_data(
-            request,
-            [](app_control_h from, const char* key, void* data) {
-                char* value = nullptr;
-                app_control_get_extra_data(from, key, &value);
-                static_cast<std::string*>(data)->append(std::string(" ") + key + "=" + value);
-                std::free(value);
-                return true;
-            },
-            &line);
-        tell(line);
-        if (inAppControl)
-            inAppControl();
-    }
-
-private:
-    void tell(const std::string& what) { story.push_back(what); }
-};
 
 class Application : public test_ui::UiTest {
 protected:
@@ -216,91 +166,6 @@ TEST_F(Application, FindsItsOwnTextsAndTheDevices) {
     EXPECT_STREQ("UTF-8", bind_textdomain_codeset("app", nullptr));
     EXPECT_EQ((device_.data() / "locale").string(), bindtextdomain("sys_string", nullptr));
     EXPECT_STREQ("UTF-8", bind_textdomain_codeset("sys_string", nullptr));
-}
-
-TEST_F(Application, SpeaksTheDevicesLanguageBeforeItIsCreated) {
-    set(device::keys::language, "ru_RU.UTF-8");
-    std::string language;
-    app_.inCreate = [&] { language = std::getenv("LANGUAGE"); };
-    RunningApp running(app_);
-    EXPECT_EQ("ru_RU", language);
-    EXPECT_STRNE("C", setlocale(LC_MESSAGES, nullptr));
-}
-
-TEST_F(Application, ALanguageChangeReachesTheLocaleFirstAndThenTheHandlers) {
-    WAppEventHandler handler;
-    Story languages;
-    handler.addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED,
-        [&](app_event_info_h info, void* userData) {
-            EXPECT_NE(nullptr, info);
-            EXPECT_EQ(&app_, userData);
-            languages.push_back(std::getenv("LANGUAGE"));
-        },
-        &app_);
-    handler.addEventHandler(
-        APP_EVENT_REGION_FORMAT_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
-    handler.addEventHandler(APP_EVENT_LANGUAGE_CHANGED, nullptr, nullptr);
-    RunningApp running(app_);
-    set(device::keys::language, "ko_KR.UTF-8");
-    set(device::keys::country, "IN");
-    EXPECT_THAT(languages, ElementsAre("ko_KR"));
-}
-
-TEST_F(Application, AHandlerMayDestroyItselfAndOthersWhileItRuns) {
-    auto first = std::make_unique<WAppEventHandler>();
-    auto second = std::make_unique<WAppEventHandler>();
-    int calls = 0;
-    first->addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED,
-        [&](app_event_info_h, void*) {
-            first.reset();
-            second.reset();
-            ++calls;
-        },
-        nullptr);
-    second->addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
-    RunningApp running(app_);
-    set(device::keys::language, "ko_KR.UTF-8");
-    set(device::keys::language, "ru_RU.UTF-8");
-    EXPECT_EQ(1, calls);
-}
-
-TEST_F(Application, AnExceptionInAHandlerStaysOutOfEflAndOfTheOthersWay) {
-    WAppEventHandler handler;
-    int calls = 0;
-    handler.addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { throw std::runtime_error("no more room"); }, nullptr);
-    handler.addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
-    RunningApp running(app_);
-    set(device::keys::language, "ko_KR.UTF-8");
-    EXPECT_EQ(1, calls);
-    EXPECT_THAT(device_.logMessages(), testing::Contains("E APP_ASSIST an event handler failed: no more room"));
-}
-
-TEST_F(Application, AThemeChangeReachesTheThemeCallbacks) {
-    RunningApp running(app_);
-    int calls = 0;
-    const uxt_theme_changed_cb count = [](void* data) { ++*static_cast<int*>(data); };
-    uxt_theme_add_changed_callback(nullptr, count, &calls);
-    set(device::keys::theme, "dark");
-    EXPECT_EQ(1, calls);
-    set(device::keys::language, "ko_KR.UTF-8");
-    EXPECT_EQ(1, calls);
-    uxt_theme_delete_changed_callback(nullptr, count);
-}
-
-TEST_F(Application, HearsOfNothingAfterItsEnd) {
-    WAppEventHandler handler;
-    int calls = 0;
-    handler.addEventHandler(
-        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
-    RunningApp running(app_);
-    running.end();
-    set(device::keys::language, "ko_KR.UTF-8");
-    EXPECT_EQ(0, calls);
 }
 
 }  // namespace

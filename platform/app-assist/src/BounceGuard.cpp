@@ -24,7 +24,8 @@ void BounceGuard::attach(Evas_Object* scroller) {
         if (self->job_)
             ecore_job_del(self->job_);
     });
-    guard.release();
+    // The scroller has it from now on.
+    static_cast<void>(guard.release());
 }
 
 // Not at once: EFL takes its animation up again when the callback has returned.

@@ -55,7 +55,8 @@ void DragGuard::attach(Evas_Object* scroller) {
                 ecore_job_del(self->job_);
         },
         guard.get());
-    guard.release();
+    // The scroller has it from now on.
+    static_cast<void>(guard.release());
 }
 
 void DragGuard::dragBegins() {

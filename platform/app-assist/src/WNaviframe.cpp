@@ -19,7 +19,7 @@ constexpr char selfKey[] = "app_assist::WNaviframe";
 WNaviframe::WNaviframe() = default;
 
 WNaviframe::~WNaviframe() {
-    destroy();
+    WNaviframe::destroy();
     if (emptyItemsJob_)
         ecore_job_del(emptyItemsJob_);
     for (WView* view : views_)

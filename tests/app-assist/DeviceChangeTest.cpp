@@ -1,0 +1,116 @@
+#include "TellingApp.h"
+
+#include "support/TemporaryDevice.h"
+#include "ui/RunningApp.h"
+#include "ui/UiTest.h"
+
+#include <app-assist/WAppEventHandler.h>
+#include <device/Keys.h>
+#include <gmock/gmock.h>
+#include <ui_extension.h>
+
+#include <locale.h>
+
+using app_assist::WAppEventHandler;
+using test_ui::RunningApp;
+using testing::ElementsAre;
+
+namespace {
+
+using Story = std::vector<std::string>;
+
+/// What an application hears of its device's changes.
+class DeviceChange : public test_ui::UiTest {
+protected:
+    void set(const char* key, const char* value) { device_->settings().set(key, value); }
+
+    support::TemporaryDevice device_;
+    TellingApp app_;
+};
+
+TEST_F(DeviceChange, SpeaksTheDevicesLanguageBeforeItIsCreated) {
+    set(device::keys::language, "ru_RU.UTF-8");
+    std::string language;
+    app_.inCreate = [&] { language = std::getenv("LANGUAGE"); };
+    RunningApp running(app_);
+    EXPECT_EQ("ru_RU", language);
+    EXPECT_STRNE("C", setlocale(LC_MESSAGES, nullptr));
+}
+
+TEST_F(DeviceChange, ALanguageChangeReachesTheLocaleFirstAndThenTheHandlers) {
+    WAppEventHandler handler;
+    Story languages;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED,
+        [&](app_event_info_h info, void* userData) {
+            EXPECT_NE(nullptr, info);
+            EXPECT_EQ(&app_, userData);
+            languages.push_back(std::getenv("LANGUAGE"));
+        },
+        &app_);
+    handler.addEventHandler(
+        APP_EVENT_REGION_FORMAT_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
+    handler.addEventHandler(APP_EVENT_LANGUAGE_CHANGED, nullptr, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    set(device::keys::country, "IN");
+    EXPECT_THAT(languages, ElementsAre("ko_KR"));
+}
+
+TEST_F(DeviceChange, AHandlerMayDestroyItselfAndOthersWhileItRuns) {
+    auto first = std::make_unique<WAppEventHandler>();
+    auto second = std::make_unique<WAppEventHandler>();
+    int calls = 0;
+    first->addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED,
+        [&](app_event_info_h, void*) {
+            first.reset();
+            second.reset();
+            ++calls;
+        },
+        nullptr);
+    second->addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    set(device::keys::language, "ru_RU.UTF-8");
+    EXPECT_EQ(1, calls);
+}
+
+TEST_F(DeviceChange, AnExceptionInAHandlerStaysOutOfEflAndOfTheOthersWay) {
+    WAppEventHandler handler;
+    int calls = 0;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { throw std::runtime_error("no more room"); }, nullptr);
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
+    RunningApp running(app_);
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(1, calls);
+    EXPECT_THAT(device_.logMessages(), testing::Contains("E APP_ASSIST an event handler failed: no more room"));
+}
+
+TEST_F(DeviceChange, AThemeChangeReachesTheThemeCallbacks) {
+    RunningApp running(app_);
+    int calls = 0;
+    const uxt_theme_changed_cb count = [](void* data) { ++*static_cast<int*>(data); };
+    uxt_theme_add_changed_callback(nullptr, count, &calls);
+    set(device::keys::theme, "dark");
+    EXPECT_EQ(1, calls);
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(1, calls);
+    uxt_theme_delete_changed_callback(nullptr, count);
+}
+
+TEST_F(DeviceChange, HearsOfNothingAfterItsEnd) {
+    WAppEventHandler handler;
+    int calls = 0;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { ++calls; }, nullptr);
+    RunningApp running(app_);
+    running.end();
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_EQ(0, calls);
+}
+
+}  // namespace
