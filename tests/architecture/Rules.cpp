@@ -92,81 +92,15 @@ bool isStandardHeader(const std::string& header) {
     static const std::regex c("(assert|ctype|errno|fcntl|limits|locale|stdarg|stdbool|stddef|stdint|stdio|stdlib|"
                               "string|strings|time|unistd|sys/stat|sys/types)\\.h");
     // C++14's: what came later is not on the device.
-    static const std::set<std::string> cpp = {"algorithm",
-                                              "array",
-                                              "atomic",
-                                              "bitset",
-                                              "cassert",
-                                              "cctype",
-                                              "cerrno",
-                                              "cfenv",
-                                              "cfloat",
-                                              "chrono",
-                                              "cinttypes",
-                                              "climits",
-                                              "clocale",
-                                              "cmath",
-                                              "codecvt",
-                                              "complex",
-                                              "condition_variable",
-                                              "csetjmp",
-                                              "csignal",
-                                              "cstdarg",
-                                              "cstddef",
-                                              "cstdint",
-                                              "cstdio",
-                                              "cstdlib",
-                                              "cstring",
-                                              "ctime",
-                                              "cuchar",
-                                              "cwchar",
-                                              "cwctype",
-                                              "deque",
-                                              "exception",
-                                              "forward_list",
-                                              "fstream",
-                                              "functional",
-                                              "future",
-                                              "initializer_list",
-                                              "iomanip",
-                                              "ios",
-                                              "iosfwd",
-                                              "iostream",
-                                              "istream",
-                                              "iterator",
-                                              "limits",
-                                              "list",
-                                              "locale",
-                                              "map",
-                                              "memory",
-                                              "mutex",
-                                              "new",
-                                              "numeric",
-                                              "ostream",
-                                              "queue",
-                                              "random",
-                                              "ratio",
-                                              "regex",
-                                              "scoped_allocator",
-                                              "set",
-                                              "shared_mutex",
-                                              "sstream",
-                                              "stack",
-                                              "stdexcept",
-                                              "streambuf",
-                                              "string",
-                                              "system_error",
-                                              "thread",
-                                              "tuple",
-                                              "type_traits",
-                                              "typeindex",
-                                              "typeinfo",
-                                              "unordered_map",
-                                              "unordered_set",
-                                              "utility",
-                                              "valarray",
-                                              "vector"};
-    return std::regex_match(header, c) || cpp.count(header) != 0;
+    static const std::string cpp =
+        " algorithm array atomic bitset cassert cctype cerrno cfenv cfloat chrono cinttypes climits "
+        "clocale cmath codecvt complex condition_variable csetjmp csignal cstdarg cstddef cstdint "
+        "cstdio cstdlib cstring ctime cuchar cwchar cwctype deque exception forward_list fstream "
+        "functional future initializer_list iomanip ios iosfwd iostream istream iterator limits list "
+        "locale map memory mutex new numeric ostream queue random ratio regex scoped_allocator set "
+        "shared_mutex sstream stack stdexcept streambuf string system_error thread tuple type_traits "
+        "typeindex typeinfo unordered_map unordered_set utility valarray vector ";
+    return std::regex_match(header, c) || cpp.find(" " + header + " ") != std::string::npos;
 }
 
 }  // namespace
