@@ -4,6 +4,7 @@
 #include "device/Error.h"
 #include "device/Keys.h"
 #include "support/Message.h"
+#include "support/Privileges.h"
 #include "support/Process.h"
 #include "support/TemporaryDevice.h"
 
@@ -289,13 +290,9 @@ TEST(Database, ThatMayNotBeWrittenIsToldOf) {
     const auto options = optionsFor(there.path() / "device");
     Device{options};
     auto other = Process::ofWork([&] {
-        for (const auto& entry : std::filesystem::recursive_directory_iterator(there.path()))
-            if (chmod(entry.path().c_str(), entry.is_directory() ? 0777 : 0666) != 0)
-                return 2;
-        chmod(there.path().c_str(), 0755);
-        chmod(options.folder.database().c_str(), 0444);
-        if (geteuid() == 0 && setuid(65534) != 0)
-            return 3;
+        std::filesystem::permissions(options.folder.database(), std::filesystem::perms(0444));
+        if (!support::obeyPermissions())
+            return 2;
         return messageOf([&] { Device device(options); }) ==
                        options.folder.database().string() +
                            ": cannot be written; make it and its folder writable for this user"

@@ -39,16 +39,22 @@ int print(log_priority priority, const char* tag, const char* format, va_list ar
     return length;
 }
 
+/// A function of its own: an array of arguments, which va_list is, cannot be handed on as one.
+int printOnDevice(log_priority priority, const char* tag, const char* format, va_list arguments) {
+    int result = failed;
+    service::callOnDevice("dlog_print", [&](device::Device&) {
+        result = print(priority, tag, format, arguments);
+        return TIZEN_ERROR_NONE;
+    });
+    return result;
+}
+
 }  // namespace
 
 int dlog_print(log_priority prio, const char* tag, const char* fmt, ...) {
     va_list arguments;
     va_start(arguments, fmt);
-    int result = failed;
-    service::callOnDevice("dlog_print", [&](device::Device&) {
-        result = print(prio, tag, fmt, arguments);
-        return TIZEN_ERROR_NONE;
-    });
+    const int result = printOnDevice(prio, tag, fmt, arguments);
     va_end(arguments);
     return result;
 }

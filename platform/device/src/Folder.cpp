@@ -55,7 +55,7 @@ Folder Folder::resolve() {
     throw Error("no folder for the device: none of KEST_DEVICE, XDG_STATE_HOME and HOME is set; set KEST_DEVICE");
 }
 
-Folder::Folder(std::filesystem::path root) : root_(resolved(root)) {
+Folder::Folder(const std::filesystem::path& root) : root_(resolved(root)) {
     const std::string text = root_.string();
     if (std::any_of(text.begin(), text.end(), markupCannotCarry))
         throw Error("the device's folder \"" + printable(text) +

@@ -42,7 +42,7 @@ bool isInside(const std::filesystem::path& path, const std::filesystem::path& fo
 
 std::filesystem::path checkedSource(const std::filesystem::path& source, const Folder& folder) {
     std::error_code error;
-    const std::filesystem::path resolved = std::filesystem::canonical(source, error);
+    std::filesystem::path resolved = std::filesystem::canonical(source, error);
     if (error)
         throw Error(source.string() + ": " + error.message() + "; name the folder of a package");
     if (!std::filesystem::is_directory(resolved, error))

@@ -16,7 +16,7 @@ public:
     /// Makes the path absolute and follows the links in it, so that one folder has one name in all processes.
     /// Throws Error when it holds a blank, a control character, one of <>&"' or bytes that are not UTF-8: the
     /// applications' markup refers to files as `href=file:PATH`, which cannot carry them.
-    explicit Folder(std::filesystem::path root);
+    explicit Folder(const std::filesystem::path& root);
 
     /// Makes the folder (mode 0700) with its parents, if it is not there.
     /// Throws Error when it cannot be made or written, or when something else stands in its place.
