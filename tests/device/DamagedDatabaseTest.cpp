@@ -127,6 +127,7 @@ TEST(Database, ThatIsDamagedIsSetAsideByOneOfManyProcesses) {
     const auto options = optionsFor(there.path());
     writeFile(options.folder.database(), std::string(10000, 'x'));
     std::vector<Process> processes;
+    processes.reserve(6);
     for (int number = 0; number < 6; ++number)
         processes.push_back(Process::ofWork([&] {
             try {

@@ -43,6 +43,7 @@ TEST(Database, IsWrittenAheadAndCarriesTheVersionOfItsSchema) {
 TEST(Database, IsMadeOnceWhenManyProcessesMakeIt) {
     const TemporaryFolder there;
     std::vector<Process> processes;
+    processes.reserve(8);
     for (int number = 0; number < 8; ++number)
         processes.push_back(Process::ofWork([&, number] {
             Device device(optionsFor(there.path() / "device"));

@@ -11,6 +11,7 @@
 
 inline std::vector<std::string> idsOf(const std::vector<device::Package>& packages) {
     std::vector<std::string> ids;
+    ids.reserve(packages.size());
     for (const device::Package& package : packages)
         ids.push_back(package.id);
     return ids;

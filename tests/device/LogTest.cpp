@@ -96,6 +96,7 @@ TEST_F(LogFile, LosesNoLineAndMixesNoneWhenProcessesShareIt) {
     constexpr int processes = 4;
     constexpr int lines = 1500;
     std::vector<Process> writers;
+    writers.reserve(processes);
     for (int number = 0; number < processes; ++number)
         writers.push_back(Process::ofWork([&, number] {
             Log same(file);

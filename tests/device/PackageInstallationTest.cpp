@@ -100,7 +100,7 @@ TEST_F(PackageEvents, AreNoneForWhatIsNoPackage) {
 class RefusedPackages : public InstalledPackages {
 protected:
     std::string messageFor(const std::filesystem::path& folder) const {
-        const std::string message = messageOf([&] { packages.install(folder); });
+        std::string message = messageOf([&] { packages.install(folder); });
         EXPECT_FALSE(packages.find("com.example.tea"));
         return message;
     }
@@ -234,6 +234,7 @@ TEST_F(PackageInstallation, ThatAnUnfinishedRemovalLeftAreCleanedByTheNextInstal
 
 TEST_F(PackageInstallation, MayBeInstalledByTwoProcessesAtOnce) {
     std::vector<std::filesystem::path> sources;
+    sources.reserve(10);
     for (int number = 0; number < 10; ++number)
         sources.push_back(makePackage("com.example.tea", std::to_string(number)));
     const auto installer = [&] {
