@@ -19,6 +19,12 @@ namespace {
 
 using Story = std::vector<std::string>;
 
+/// gettext's language of this process.
+std::string languageOfTexts() {
+    const char* language = std::getenv("LANGUAGE");
+    return language ? language : "none";
+}
+
 /// What an application hears of its device's changes.
 class DeviceChange : public test_ui::UiTest {
 protected:
@@ -31,7 +37,7 @@ protected:
 TEST_F(DeviceChange, SpeaksTheDevicesLanguageBeforeItIsCreated) {
     set(device::keys::language, "ru_RU.UTF-8");
     std::string language;
-    app_.inCreate = [&] { language = std::getenv("LANGUAGE"); };
+    app_.inCreate = [&] { language = languageOfTexts(); };
     RunningApp running(app_);
     EXPECT_EQ("ru_RU", language);
     EXPECT_STRNE("C", setlocale(LC_MESSAGES, nullptr));
@@ -45,7 +51,7 @@ TEST_F(DeviceChange, ALanguageChangeReachesTheLocaleFirstAndThenTheHandlers) {
         [&](app_event_info_h info, void* userData) {
             EXPECT_NE(nullptr, info);
             EXPECT_EQ(&app_, userData);
-            languages.push_back(std::getenv("LANGUAGE"));
+            languages.push_back(languageOfTexts());
         },
         &app_);
     handler.addEventHandler(
