@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KestContentInfo.h"
+#include "KestTextTags.h"
 
 #include <libxml/tree.h>
 
@@ -58,6 +59,8 @@ private:
     void __getFromPreference(const std::string& path, KestContentInfo& record);
 
     std::vector<KestContentInfo> contentsList;
+    /// Of the detail file that is being read.
+    KestTextWork textWork;
     /// Translations of the string files, by region + "_" + string id. Kept over loads.
     std::map<std::string, std::string> stringTable;
 };

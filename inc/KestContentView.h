@@ -9,8 +9,6 @@ public:
     /// `pushOnTop` false makes the view the top item without a transition.
     KestContentView(int listIndex, bool pushOnTop);
 
-    const char* getClassName() const override { return "KestContentView"; }
-
 protected:
     Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override;
     void onCreated() override {}

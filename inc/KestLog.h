@@ -23,9 +23,9 @@ inline const char* kestLogFileName(const char* path) {
     dlog_print(priority, KEST_LOG_TAG, "%s: %s(%d) > " format, kestLogFileName(__FILE__), __func__, __LINE__,          \
                ##__VA_ARGS__)
 
-/// Entry trace, at the start of constructors, onCreate, onPushed and loaders.
+/// Entry trace, where a function's start is worth a line.
 #define KEST_BEGIN() KEST_LOG_WRITE(DLOG_INFO, KEST_LOG_COLOR_GREEN "BEGIN >>>>" KEST_LOG_COLOR_END)
-/// Trace at the start of callbacks.
+/// Trace of a callback or of an access to the cache.
 #define KEST_HIT() KEST_LOG_WRITE(DLOG_INFO, KEST_LOG_COLOR_BLUE ">>>HIT<<<" KEST_LOG_COLOR_END)
 #define KEST_INFO(format, ...) KEST_LOG_WRITE(DLOG_INFO, format, ##__VA_ARGS__)
 #define KEST_WARN(format, ...)                                                                                         \

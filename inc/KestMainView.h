@@ -15,8 +15,6 @@ public:
     explicit KestMainView(bool pushOnTop);
     ~KestMainView() override;
 
-    const char* getClassName() const override { return "KestMainView"; }
-
 protected:
     Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override;
     void onCreated() override {}

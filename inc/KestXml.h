@@ -15,12 +15,12 @@ public:
         Empty     ///< no root element, or a root without children
     };
 
-    /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened, nor one that is
-    /// compressed or larger than 64 MiB. References to
-    /// entities that the file declares are left out when they stand for more text than any catalogue has.
+    /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened. Nor is parsed
+    /// what is compressed, larger than 16 MiB, or has thousands of attributes in one tag. References to entities that
+    /// the file declares are left out when they stand for more text than any catalogue has.
     Result read(const std::string& path);
 
-    /// The first element of that name below the root; null when there is none.
+    /// The first element of that name below the root; null when there is none. Only after read() said Ok.
     xmlNode* findSection(const char* name) const;
 
     static bool isElement(const xmlNode* node, const char* name);

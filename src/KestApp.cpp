@@ -43,12 +43,14 @@ Evas_Object* createWindow(const app_assist::WWindow* window) {
     return win;
 }
 
-std::string readExtra(app_control_h request, const char* key) {
+/// False when the request has no such extra.
+bool readExtra(app_control_h request, const char* key, std::string& result) {
     KestPlatformString value;
     if (app_control_get_extra_data(request, key, value.out()) != APP_CONTROL_ERROR_NONE) {
-        return "";
+        return false;
     }
-    return value.str();
+    result = value.str();
+    return true;
 }
 
 }  // namespace
@@ -88,8 +90,8 @@ void KestApp::onAppControl(app_control_h request, bool firstLaunch) {
         KEST_ERR("request == NULL");
         return;
     }
-    const std::string appId = readExtra(request, "appID");
-    if (appId.empty()) {
+    std::string appId;
+    if (!readExtra(request, "appID", appId)) {
         KEST_INFO("app_control_get_extra_data() appID Failed");
     }
     auto* naviframe = getWindow() ? static_cast<app_assist::WNaviframe*>(getWindow()->getBaseUiObject()) : nullptr;
@@ -98,6 +100,10 @@ void KestApp::onAppControl(app_control_h request, bool firstLaunch) {
     }
     mainView = new KestMainView(true);
     naviframe->push(mainView, nullptr, nullptr);
+    if (!naviframe->isTopView(mainView)) {
+        // The naviframe has freed a view that it could not push.
+        mainView = nullptr;
+    }
 }
 
 void KestApp::__languageChanged(app_event_info_h, void*) {

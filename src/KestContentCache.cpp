@@ -37,7 +37,7 @@ std::string keyBase(const std::string& path) {
 
 bool readString(const std::string& key, std::string& result) {
     KestPlatformString value;
-    if (preference_get_string(key.c_str(), value.out()) != PREFERENCE_ERROR_NONE || !value) {
+    if (preference_get_string(key.c_str(), value.out()) != PREFERENCE_ERROR_NONE) {
         return false;
     }
     result = value.str();

@@ -6,6 +6,7 @@
 #include "KestMarkup.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
+#include "KestTextDomain.h"
 #include "KestTextTags.h"
 #include "KestXml.h"
 
@@ -32,11 +33,6 @@ const char* failureOf(KestXmlDocument::Result result) {
         break;
     }
     return nullptr;
-}
-
-/// A domain is a file's name for gettext: one with a slash would lead it anywhere.
-bool hasTranslation(const std::string& domain, const std::string& id) {
-    return domain.find('/') == std::string::npos && id != dgettext(domain.c_str(), id.c_str());
 }
 
 std::string detailPath(const KestContentInfo& record) {
@@ -152,6 +148,7 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
         KEST_ERR("%s", failure);
         return false;
     }
+    textWork = KestTextWork();
     record.menuTitle = "No Title";
     record.textContents = "No Contents";
     record.iconPath = __getIconPath(record.appid);
@@ -202,10 +199,12 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
         record.launchParamValue = text;
     } else if (KestXmlDocument::hasName(node, "attach")) {
         const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
-        if (content && id) {
-            const std::string fragment = __convertHrefPath(record.appid, text);
-            record.textContents =
-                KestMarkup::replaceString(record.textContents, KestXmlDocument::str(id), fragment, true);
+        if (content && id && textWork.spend(record.textContents.size())) {
+            const std::string placeholder = KestXmlDocument::str(id);
+            const size_t found = KestMarkup::find(record.textContents, placeholder, 0);
+            if (found != std::string::npos) {
+                record.textContents.replace(found, placeholder.size(), __convertHrefPath(record.appid, text));
+            }
         }
     }
 }
@@ -276,7 +275,8 @@ bool KestContentMgr::__isStringAvailable(const std::string& id, const std::strin
     if (id.empty()) {
         return false;
     }
-    if (hasTranslation(domain, id) || hasTranslation(ownDomain, id) || hasTranslation(systemDomain, id)) {
+    if (KestTextDomain::hasText(domain, id) || KestTextDomain::hasText(ownDomain, id) ||
+        KestTextDomain::hasText(systemDomain, id)) {
         return true;
     }
     return __findInStringTable(id) != nullptr;
@@ -298,15 +298,15 @@ const std::string* KestContentMgr::__findInStringTable(const std::string& id) co
 }
 
 std::string KestContentMgr::__getString(const std::string& id, const std::string& domain) {
-    bindtextdomain(domain.c_str(), kest_paths::locale);
-    if (hasTranslation(ownDomain, id)) {
+    KestTextDomain::bind(domain, kest_paths::locale);
+    if (KestTextDomain::hasText(ownDomain, id)) {
         return dgettext(ownDomain, id.c_str());
     }
-    bindtextdomain(domain.c_str(), kest_paths::systemLocale);
-    if (hasTranslation(domain, id)) {
+    KestTextDomain::bind(domain, kest_paths::systemLocale);
+    if (KestTextDomain::hasText(domain, id)) {
         return dgettext(domain.c_str(), id.c_str());
     }
-    if (hasTranslation(systemDomain, id)) {
+    if (KestTextDomain::hasText(systemDomain, id)) {
         return dgettext(systemDomain, id.c_str());
     }
     const std::string* value = __findInStringTable(id);
@@ -314,7 +314,7 @@ std::string KestContentMgr::__getString(const std::string& id, const std::string
 }
 
 std::string KestContentMgr::__translateContents(const std::string& domain, const std::string& contents) {
-    KestTextTags tags(contents);
+    KestTextTags tags(contents, textWork);
     for (std::string tag = tags.first(); !tag.empty(); tag = tags.first()) {
         const std::string id = KestMarkup::extractString(tag, "id=\"", "\">", false);
         if (id.empty()) {

@@ -2,6 +2,7 @@
 
 #include <sys/stat.h>
 
+#include <algorithm>
 #include <fstream>
 
 bool KestFiles::isRegular(const std::string& path) {
@@ -21,8 +22,8 @@ std::uintmax_t KestFiles::size(const std::string& path) {
 
 std::string KestFiles::readBegin(const std::string& path, size_t length) {
     std::ifstream file(path, std::ios::binary);
-    std::string begin(length, '\0');
-    file.read(&begin[0], static_cast<std::streamsize>(length));
+    std::string begin(std::min(length, static_cast<size_t>(size(path))), '\0');
+    file.read(&begin[0], static_cast<std::streamsize>(begin.size()));
     begin.resize(static_cast<size_t>(file.gcount()));
     return begin;
 }

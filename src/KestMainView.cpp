@@ -125,6 +125,9 @@ void KestMainView::__createMainList() {
         auto* row = new RowData{nullptr, i, this};
         row->item =
             elm_genlist_item_append(__genlist, &__menuItc, row, nullptr, ELM_GENLIST_ITEM_NONE, __selectItemCb, this);
+        if (!row->item) {
+            delete row;
+        }
     }
 }
 

@@ -9,18 +9,33 @@ namespace {
 const char tagBegin[] = "<text";
 const char tagEnd[] = "</text>";
 
-const int mostReplacements = 10000;
-/// Long tags that bring each other back reach this long before the number of replacements ends them.
-const size_t mostInserted = 64 * KestTextTags::longestContents;
-
 }  // namespace
 
 const size_t KestTextTags::longestContents;
 
-KestTextTags::KestTextTags(std::string contents)
-    : contents_(std::move(contents)), begin_(0), replacements_(0), inserted_(0) {}
+bool KestTextWork::spend(size_t bytes) {
+    if (bytes > bytes_) {
+        return false;
+    }
+    bytes_ -= bytes;
+    return true;
+}
+
+bool KestTextWork::spendReplacement() {
+    if (replacements_ == 0) {
+        return false;
+    }
+    --replacements_;
+    return true;
+}
+
+KestTextTags::KestTextTags(std::string contents, KestTextWork& work)
+    : contents_(std::move(contents)), begin_(0), work_(work) {}
 
 std::string KestTextTags::first() {
+    if (begin_ == std::string::npos) {
+        return "";
+    }
     // A value may have completed a beginning that stood in front of it.
     const size_t overlap = sizeof(tagBegin) - 2;
     begin_ = KestMarkup::find(contents_, tagBegin, begin_ > overlap ? begin_ - overlap : 0);
@@ -39,13 +54,14 @@ size_t KestTextTags::countOccurrences() const {
 
 bool KestTextTags::replaceFirst(const std::string& value) {
     const size_t count = countOccurrences();
-    const size_t kept = contents_.size() - count * tag_.size();
-    const bool tooLong = contents_.size() > longestContents || value.size() > (longestContents - kept) / count;
-    inserted_ += tooLong ? 0 : count * value.size();
-    if (tooLong || inserted_ > mostInserted || replacements_ == mostReplacements) {
+    if (count == 0) {
         return false;
     }
-    ++replacements_;
+    const size_t kept = contents_.size() - count * tag_.size();
+    const bool tooLong = contents_.size() > longestContents || value.size() > (longestContents - kept) / count;
+    if (tooLong || !work_.spend(count * value.size()) || !work_.spendReplacement()) {
+        return false;
+    }
     if (count == 1) {
         contents_.replace(begin_, tag_.size(), value);
         return true;

@@ -16,19 +16,45 @@ void freeText(xmlChar* text) {
 }
 
 /// Files that are larger take more memory, parsed, than a device has.
-const std::uintmax_t largestFile = 64 * 1024 * 1024;
+const std::uintmax_t largestFile = 16 * 1024 * 1024;
+
+/// The parser compares every attribute of an element with all the others.
+const size_t mostAttributes = 4096;
+
+bool beginsWith(const std::string& text, const std::string& begin) {
+    return text.compare(0, begin.size(), begin) == 0;
+}
 
 /// The parser would unpack it, to any size.
-bool isCompressed(const std::string& path) {
-    const std::string gzip = "\x1f\x8b";
-    const std::string xz = "\xfd"
-                           "7zXZ";
-    const std::string begin = KestFiles::readBegin(path, xz.size());
-    return begin == xz || begin.compare(0, gzip.size(), gzip) == 0;
+bool isCompressed(const std::string& text) {
+    const std::string gzip("\x1f\x8b");
+    const std::string xz("\xfd"
+                         "7zXZ");
+    const std::string lzma("\x5d\0\0", 3);
+    return beginsWith(text, gzip) || beginsWith(text, xz) || beginsWith(text, lzma);
+}
+
+/// Counted roughly: what looks like attributes between two angle brackets.
+bool hasTooManyAttributes(const std::string& text) {
+    size_t count = 0;
+    char last = '\0';
+    for (const char character : text) {
+        if (character == '<' || character == '>') {
+            count = 0;
+        } else if (last == '=' && (character == '"' || character == '\'') && ++count > mostAttributes) {
+            return true;
+        }
+        last = character;
+    }
+    return false;
 }
 
 bool isReadable(const std::string& path) {
-    return KestFiles::isRegular(path) && KestFiles::size(path) <= largestFile && !isCompressed(path);
+    if (!KestFiles::isRegular(path) || KestFiles::size(path) > largestFile) {
+        return false;
+    }
+    const std::string text = KestFiles::readBegin(path, largestFile);
+    return !isCompressed(text) && !hasTooManyAttributes(text);
 }
 
 /// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand

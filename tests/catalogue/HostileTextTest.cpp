@@ -161,6 +161,19 @@ TEST_F(HostileText, AttachmentsIdMayBeNearlyWhatTheContentsAreFullOf) {
               text);
 }
 
+TEST_F(HostileText, ManyContentsDoNotTakeLongerThanOneThatBringsItselfBack) {
+    writeStrings({{"en", "IDS_AGAIN", textTag("IDS_AGAIN") + std::string(2000, 'x')}});
+    loadTip(repeated(contents(textTag("IDS_AGAIN")), 5000));
+    EXPECT_TRUE(result());
+}
+
+TEST_F(HostileText, ADomainMayHaveAnyName) {
+    EXPECT_EQ(
+        loadTip("<textdomain>" + std::string(9000000, 'd') + "</textdomain><title id=\"IDS_NOBODY_KNOWS\">T</title>")
+            .menuTitle,
+        "T");
+}
+
 TEST_F(HostileText, AttachmentsMayBeTenThousand) {
     EXPECT_EQ(loadTip(contents("A" + std::string(100000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 10000))
                   .textContents.size(),

@@ -33,6 +33,57 @@ TEST_F(EflAnswers, AreWhatEflItselfCallsToo) {
     EXPECT_THAT(where.dli_fname, testing::HasSubstr("efl-answers-tests"));
 }
 
+class EflAnswersForPops : public EflAnswers {
+protected:
+    EflAnswersForPops() {
+        elm_win_resize_object_add(window(), naviframe_);
+        evas_object_show(naviframe_);
+        push();
+        second_ = push();
+    }
+
+    Elm_Object_Item* push() const {
+        return elm_naviframe_item_push(naviframe_, nullptr, nullptr, nullptr, elm_layout_add(naviframe_), nullptr);
+    }
+    unsigned int items() const {
+        Eina_List* all = elm_naviframe_items_get(naviframe_);
+        const unsigned int count = eina_list_count(all);
+        eina_list_free(all);
+        return count;
+    }
+
+    Evas_Object* naviframe_ = elm_naviframe_add(window());
+    Elm_Object_Item* second_ = nullptr;
+};
+
+TEST_F(EflAnswersForPops, APopWhileTheItemMovesInIsCarriedOutWhenItHasArrived) {
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(second_, elm_naviframe_top_item_get(naviframe_));
+    test_ui::runFor(1);
+    EXPECT_EQ(1u, items());
+}
+
+TEST_F(EflAnswersForPops, TwoPopsWhileTheItemMovesInPopItAlone) {
+    elm_naviframe_item_pop(naviframe_);
+    elm_naviframe_item_pop(naviframe_);
+    test_ui::runFor(1);
+    EXPECT_EQ(1u, items());
+}
+
+TEST_F(EflAnswersForPops, APopOfAnItemThatWasCoveredMeanwhileIsForgotten) {
+    elm_naviframe_item_pop(naviframe_);
+    Elm_Object_Item* third = push();
+    test_ui::runFor(1);
+    EXPECT_EQ(third, elm_naviframe_top_item_get(naviframe_));
+    EXPECT_EQ(3u, items());
+}
+
+TEST_F(EflAnswersForPops, APopAtRestIsCarriedOutAtOnce) {
+    test_ui::runFor(1);
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(1u, items());
+}
+
 TEST_F(EflAnswers, TheScreenIsTheDevicesWhateverShowsIt) {
     EXPECT_EQ((Rect{0, 0, 720, 1280}), screenSize());
     device_->settings().set(device::keys::screen, "480x800");

@@ -35,14 +35,6 @@ bool WNaviframe::create(Evas_Object* parent, void*) {
     evas_object_smart_callback_add(
         naviframe_, "item,activated",
         [](void* self, Evas_Object*, void*) { static_cast<WNaviframe*>(self)->announceTop(); }, this);
-    evas_object_smart_callback_add(
-        naviframe_, "transition,finished",
-        [](void* data, Evas_Object*, void*) {
-            auto* self = static_cast<WNaviframe*>(data);
-            if (std::exchange(self->backWaits_, false))
-                self->back();
-        },
-        this);
     backKeys_ = std::make_unique<BackKeys>(evas_object_evas_get(naviframe_), [this] { back(); });
     return true;
 }
@@ -108,7 +100,6 @@ void WNaviframe::adopt(WView& view, Elm_Object_Item* item) {
 
 Eina_Bool WNaviframe::itemPops(void* data, Elm_Object_Item* item) {
     auto* self = static_cast<WNaviframe*>(data);
-    self->popAsked_ = true;
     bool pops = false;
     guarded("a view's onPop", [&] {
         WView* view = self->viewOf(item);
@@ -161,13 +152,8 @@ void WNaviframe::announceTop() {
 }
 
 void WNaviframe::back() {
-    const Elm_Object_Item* top = naviframe_ ? elm_naviframe_top_item_get(naviframe_) : nullptr;
-    if (!top)
-        return;
-    popAsked_ = false;
-    elm_naviframe_item_pop(naviframe_);
-    // EFL pops nothing, and says nothing, while an item is still moving in.
-    backWaits_ = !popAsked_ && naviframe_ && elm_naviframe_top_item_get(naviframe_) == top;
+    if (naviframe_)
+        elm_naviframe_item_pop(naviframe_);
 }
 
 WView* WNaviframe::viewOf(const Elm_Object_Item* item) const {

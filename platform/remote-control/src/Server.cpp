@@ -174,6 +174,7 @@ Eldbus_Message* Server::State::onTree(const Eldbus_Service_Interface* interface,
         const std::string tree = treeOf(of(interface).requireWindow());
         Eldbus_Message* reply = eldbus_message_method_return_new(request);
         eldbus_message_arguments_append(reply, "s", tree.c_str());
+        of(interface).bus.flushSoon();
         return reply;
     });
 }

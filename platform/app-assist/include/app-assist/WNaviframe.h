@@ -57,8 +57,6 @@ private:
     std::vector<Elm_Object_Item*> emptyItems_;
     Ecore_Job* emptyItemsJob_ = nullptr;
     const WView* announced_ = nullptr;
-    bool popAsked_ = false;
-    bool backWaits_ = false;
 };
 
 }  // namespace app_assist
