@@ -2,8 +2,6 @@
 
 #include "device/Error.h"
 
-#include <Ecore_Evas.h>
-
 #include <array>
 #include <cerrno>
 #include <cstring>
@@ -36,7 +34,8 @@ Object snapshotOf(Evas_Object* window) {
     evas_object_layer_set(snapshot.get(), EVAS_LAYER_MAX);
     evas_object_pass_events_set(snapshot.get(), EINA_TRUE);
     evas_object_show(snapshot.get());
-    ecore_evas_manual_render(ecore_evas_ecore_evas_get(canvas));
+    // Waits for the frame, also for one that a thread draws at this moment; the window's own drawing does not.
+    evas_render(canvas);
     return snapshot;
 }
 
