@@ -59,7 +59,7 @@ std::string itemText(const Elm_Object_Item* item, const char* part) {
 
 std::string plainText(const Evas_Object* widget, const char* part) {
     char* plain = elm_entry_markup_to_utf8(text(widget, part).c_str());
-    const std::string result = orEmpty(plain);
+    std::string result = orEmpty(plain);
     std::free(plain);
     return result;
 }
