@@ -2,7 +2,6 @@
 #include "package_info.h"
 #include "ravella-log-client.h"
 #include "support/Environment.h"
-#include "support/Process.h"
 #include "support/TemporaryDevice.h"
 #include "vconf.h"
 
@@ -11,7 +10,6 @@
 
 namespace {
 
-using support::Process;
 using support::TemporaryDevice;
 using testing::ElementsAre;
 using testing::IsEmpty;

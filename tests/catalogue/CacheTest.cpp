@@ -4,7 +4,6 @@
 
 using namespace manager_log;
 using kest_files::contents;
-using kest_files::Menu;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;

@@ -5,7 +5,6 @@ using kest_files::cdata;
 using kest_files::contents;
 using kest_files::textTag;
 using testing::Contains;
-using testing::Not;
 
 class Contents : public CatalogueTest {
 protected:

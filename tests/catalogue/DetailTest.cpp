@@ -1,9 +1,7 @@
 #include "CatalogueTest.h"
 
 using namespace manager_log;
-using kest_files::cdata;
 using kest_files::contents;
-using kest_files::Menu;
 using testing::ElementsAre;
 using testing::IsEmpty;
 

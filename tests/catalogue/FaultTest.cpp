@@ -6,7 +6,6 @@
 
 using namespace manager_log;
 using device::faults::plan;
-using kest_files::contents;
 using kest_files::textTag;
 using testing::Contains;
 using testing::ElementsAre;

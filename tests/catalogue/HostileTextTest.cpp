@@ -1,12 +1,9 @@
 #include "HostileTest.h"
 
 using namespace manager_log;
-using kest_files::cdata;
 using kest_files::contents;
-using kest_files::String;
 using kest_files::textTag;
 using testing::Contains;
-using testing::Not;
 
 /// Contents and translations that would keep the translator busy for ever.
 class HostileText : public HostileTest {

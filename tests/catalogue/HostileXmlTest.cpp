@@ -1,10 +1,6 @@
 #include "HostileTest.h"
 
 using namespace manager_log;
-using kest_files::cdata;
-using kest_files::contents;
-using kest_files::Menu;
-using testing::ElementsAre;
 using testing::IsEmpty;
 
 /// Entities: declared in a few bytes, they can stand for more than the machine has.

@@ -3,7 +3,6 @@
 #include <package_info.h>
 
 using namespace manager_log;
-using kest_files::Menu;
 using testing::ElementsAre;
 using testing::IsEmpty;
 

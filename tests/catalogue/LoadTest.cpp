@@ -3,7 +3,6 @@
 #include <cstdlib>
 
 using namespace manager_log;
-using kest_files::Menu;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;

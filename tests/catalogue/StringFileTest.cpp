@@ -2,12 +2,10 @@
 
 using namespace manager_log;
 using kest_files::contents;
-using kest_files::String;
 using kest_files::textTag;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using testing::Not;
 
 class StringFile : public CatalogueTest {
 protected:

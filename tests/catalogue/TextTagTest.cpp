@@ -3,7 +3,6 @@
 using namespace manager_log;
 using kest_files::textTag;
 using testing::Contains;
-using testing::Not;
 
 class TextTag : public CatalogueTest {
 protected:

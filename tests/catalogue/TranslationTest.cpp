@@ -7,7 +7,6 @@
 using namespace manager_log;
 using kest_files::contents;
 using kest_files::textTag;
-using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Pair;

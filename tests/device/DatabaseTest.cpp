@@ -125,7 +125,7 @@ TEST(Database, MustBeAFile) {
 TEST(Database, ThatMayNotBeWrittenIsToldOf) {
     const TemporaryFolder there;
     const auto options = optionsFor(there.path() / "device");
-    Device{options};
+    std::make_unique<Device>(options).reset();
     auto other = Process::ofWork([&] {
         std::filesystem::permissions(options.folder.database(), std::filesystem::perms(0444));
         if (!support::obeyPermissions())

@@ -6,7 +6,6 @@
 #include <sys/resource.h>
 
 using testing::IsEmpty;
-using testing::SizeIs;
 using testing::StartsWith;
 
 namespace {

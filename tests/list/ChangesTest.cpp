@@ -2,8 +2,6 @@
 
 #include <device/Keys.h>
 
-using device::PackageEvent;
-using kest_files::Menu;
 using testing::AllOf;
 using testing::Contains;
 using testing::ElementsAre;

@@ -5,7 +5,6 @@
 #include <device/Keys.h>
 
 using testing::AllOf;
-using testing::Contains;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;

@@ -4,7 +4,6 @@
 
 using kest_files::Menu;
 using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::Pair;
 
 using Rows = ListTest;

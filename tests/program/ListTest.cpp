@@ -1,7 +1,6 @@
 #include "ProgramTest.h"
 
 using testing::Contains;
-using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Not;
 using testing::SizeIs;

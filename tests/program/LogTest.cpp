@@ -1,6 +1,5 @@
 #include "ProgramTest.h"
 
-using testing::Contains;
 using testing::Each;
 using testing::IsEmpty;
 using testing::SizeIs;

@@ -2,7 +2,6 @@
 
 using testing::Contains;
 using testing::ElementsAre;
-using testing::Not;
 
 namespace {
 

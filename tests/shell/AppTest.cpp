@@ -4,10 +4,8 @@
 #include <device/Keys.h>
 #include <system_settings.h>
 
-using testing::AllOf;
 using testing::Contains;
 using testing::ElementsAre;
-using testing::ElementsAreArray;
 using testing::IsEmpty;
 using testing::Not;
 

@@ -82,7 +82,6 @@ class KilledLoad : public testing::Test {
 protected:
     KilledLoad() : device_("com.ravella.kest", "1.0.0") {
         std::vector<kest_files::Menu> menus;
-        menus.reserve(menuCount);
         for (int menu = 0; menu < menuCount; ++menu)
             menus.push_back({pathOf(menu), "com.ravella.kest", "Global"});
         support::writeFile(resources() / "contents/kest_menu.xml", kest_files::mainMenu(menus));

@@ -14,7 +14,6 @@ namespace {
 using namespace theme_test;
 using testing::Contains;
 using testing::IsEmpty;
-using testing::IsSubsetOf;
 using testing::Not;
 
 std::string fileOf(const std::string& group) {
