@@ -42,9 +42,18 @@ bool waitUntil(const std::function<bool()>& condition) {
     return false;
 }
 
+/// Empty for a process that has ended meanwhile.
+std::string readOfProcess(const fs::path& file) {
+    try {
+        return support::readFile(file);
+    } catch (const std::ios_base::failure&) {
+        return "";
+    }
+}
+
 /// Not one that has ended and only waits for its parent to notice.
 bool runs(const fs::path& process) {
-    const std::string stat = support::readFile(process / "stat");
+    const std::string stat = readOfProcess(process / "stat");
     const std::size_t state = stat.rfind(") ");
     return state != std::string::npos && stat[state + 2] != 'Z';
 }
@@ -182,8 +191,8 @@ std::vector<pid_t> TestDevice::processes() const {
         if (!isNumber(name) || name == std::to_string(getpid()) || !runs(entry.path())) {
             continue;
         }
-        const bool ours = support::readFile(entry.path() / "environ").find(marks[0]) != std::string::npos ||
-                          support::readFile(entry.path() / "cmdline").find(marks[1]) != std::string::npos;
+        const bool ours = readOfProcess(entry.path() / "environ").find(marks[0]) != std::string::npos ||
+                          readOfProcess(entry.path() / "cmdline").find(marks[1]) != std::string::npos;
         if (ours) {
             found.push_back(std::stoi(name));
         }
