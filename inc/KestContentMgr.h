@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KestContentInfo.h"
+#include "KestStringTable.h"
 #include "KestTextTags.h"
 
 #include <libxml/tree.h>
@@ -32,6 +33,9 @@ private:
     KestContentMgr();
 
     // The main menu file and the detail files.
+    /// The folder of an application's shared resources, asked once a load.
+    const std::string& __sharedResources(const std::string& appid);
+    std::string __detailPath(const KestContentInfo& record);
     bool __loadMainMenu();
     static KestContentInfo __readMenu(const xmlNode* menu);
     bool __loadDetailMenu(KestContentInfo& record);
@@ -42,7 +46,6 @@ private:
 
     // String resources and translation.
     void __loadStringResource(const KestContentInfo& record);
-    void __addString(const xmlNode* item);
     /// The translation of the node's "id" attribute, which goes to `usedId`; `text` where there is none.
     std::string __translateById(xmlNode* node, const std::string& domain, const std::string& text, std::string& usedId);
     bool __isStringAvailable(const std::string& id, const std::string& domain);
@@ -61,6 +64,11 @@ private:
     std::vector<KestContentInfo> contentsList;
     /// Of the detail file that is being read.
     KestTextWork textWork;
-    /// Translations of the string files, by region + "_" + string id. Kept over loads.
-    std::map<std::string, std::string> stringTable;
+    /// Kept over loads.
+    KestStringTable stringTable;
+    /// The display language as vconf gives it, and whether it gives one; asked once a load.
+    std::string displayLanguage;
+    bool hasDisplayLanguage;
+    /// The shared resources of the applications that this load has met, by their ids.
+    std::map<std::string, std::string> sharedResources;
 };

@@ -24,7 +24,6 @@ public:
     xmlNode* findSection(const char* name) const;
 
     static bool isElement(const xmlNode* node, const char* name);
-    static bool hasName(const xmlNode* node, const char* name);
 
     /// The node's text, markup inside it dropped, as a string that is freed with xmlFree(); null when it has none.
     using Text = std::unique_ptr<xmlChar, void (*)(xmlChar*)>;

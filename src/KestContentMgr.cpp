@@ -15,6 +15,8 @@
 #include <unistd.h>
 #include <vconf.h>
 
+#include <utility>
+
 namespace {
 
 const char menuFile[] = "contents/kest_menu.xml";
@@ -35,10 +37,6 @@ const char* failureOf(KestXmlDocument::Result result) {
     return nullptr;
 }
 
-std::string detailPath(const KestContentInfo& record) {
-    return KestCommon::getSharedResourcePath(record.appid) + record.path;
-}
-
 }  // namespace
 
 KestContentMgr* KestContentMgr::getInstance() {
@@ -46,7 +44,7 @@ KestContentMgr* KestContentMgr::getInstance() {
     return &instance;
 }
 
-KestContentMgr::KestContentMgr() {
+KestContentMgr::KestContentMgr() : hasDisplayLanguage(false) {
     KEST_BEGIN();
     loadContentsList(false);
 }
@@ -58,6 +56,7 @@ KestContentMgr::~KestContentMgr() {
 bool KestContentMgr::loadContentsList(bool force) {
     KEST_BEGIN();
     contentsList.clear();
+    sharedResources.clear();
     if (!__loadMainMenu()) {
         KEST_INFO("__loadMainMenu failed");
         return false;
@@ -73,8 +72,10 @@ bool KestContentMgr::loadContentsList(bool force) {
     // Until the load has finished no version is right, so one that is cut short leaves the cache invalid.
     KestContentCache::writeVersion("");
     const KestPlatformString language(vconf_get_str(languageKey));
-    if (language) {
-        KestContentCache::writeLanguage(language.str());
+    displayLanguage = language.str();
+    hasDisplayLanguage = static_cast<bool>(language);
+    if (hasDisplayLanguage) {
+        KestContentCache::writeLanguage(displayLanguage);
     }
     for (KestContentInfo& record : contentsList) {
         if (!__loadDetailMenu(record)) {
@@ -90,7 +91,7 @@ bool KestContentMgr::loadContentsList(bool force) {
 
 bool KestContentMgr::__loadMainMenu() {
     KEST_BEGIN();
-    const std::string path = KestCommon::getSharedResourcePath(KEST_APP_ID) + menuFile;
+    const std::string path = __sharedResources(KEST_APP_ID) + menuFile;
     const int accessible = access(path.c_str(), F_OK);
     if (accessible != 0) {
         KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
@@ -110,7 +111,7 @@ bool KestContentMgr::__loadMainMenu() {
         if (!record.isAvailable) {
             continue;
         }
-        if (access(detailPath(record).c_str(), F_OK) == 0) {
+        if (access(__detailPath(record).c_str(), F_OK) == 0) {
             contentsList.push_back(record);
         } else {
             KEST_WARN("__loadMainMenu failed : %s", record.appid.c_str());
@@ -119,15 +120,27 @@ bool KestContentMgr::__loadMainMenu() {
     return true;
 }
 
+const std::string& KestContentMgr::__sharedResources(const std::string& appid) {
+    const auto known = sharedResources.find(appid);
+    if (known != sharedResources.end()) {
+        return known->second;
+    }
+    return sharedResources[appid] = KestCommon::getSharedResourcePath(appid);
+}
+
+std::string KestContentMgr::__detailPath(const KestContentInfo& record) {
+    return __sharedResources(record.appid) + record.path;
+}
+
 KestContentInfo KestContentMgr::__readMenu(const xmlNode* menu) {
     KestContentInfo record;
     for (xmlNode* node = menu->children; node; node = node->next) {
         const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
-        if (KestXmlDocument::hasName(node, "path")) {
+        if (KestXmlDocument::isElement(node, "path")) {
             record.path = text;
-        } else if (KestXmlDocument::hasName(node, "appid")) {
+        } else if (KestXmlDocument::isElement(node, "appid")) {
             record.appid = text;
-        } else if (KestXmlDocument::hasName(node, "state")) {
+        } else if (KestXmlDocument::isElement(node, "state")) {
             record.isAvailable = text != "NOK" && text.find(KestCommon::getRegion()) != std::string::npos;
         }
     }
@@ -137,7 +150,7 @@ KestContentInfo KestContentMgr::__readMenu(const xmlNode* menu) {
 bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
     KEST_BEGIN();
     __loadStringResource(record);
-    const std::string path = detailPath(record);
+    const std::string path = __detailPath(record);
     const int accessible = access(path.c_str(), F_OK);
     if (accessible != 0) {
         KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
@@ -159,7 +172,7 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
             continue;
         }
         for (xmlNode* node = item->children; node; node = node->next) {
-            if (!KestXmlDocument::hasName(node, "contents")) {
+            if (!KestXmlDocument::isElement(node, "contents")) {
                 __readDetail(node, record);
                 continue;
             }
@@ -178,26 +191,26 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
 void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
     const KestXmlDocument::Text content = KestXmlDocument::content(node);
     const std::string text = KestXmlDocument::str(content);
-    if (KestXmlDocument::hasName(node, "textdomain")) {
+    if (KestXmlDocument::isElement(node, "textdomain")) {
         record.textdomain = text;
-    } else if (KestXmlDocument::hasName(node, "title")) {
+    } else if (KestXmlDocument::isElement(node, "title")) {
         std::string id;
         record.menuTitle = __translateById(node, record.textdomain, text, id);
         if (!id.empty()) {
             record.titleId = id;
         }
-    } else if (KestXmlDocument::hasName(node, "appname")) {
+    } else if (KestXmlDocument::isElement(node, "appname")) {
         std::string id;
         record.appName = __translateById(node, record.textdomain, text, id);
-    } else if (KestXmlDocument::hasName(node, "image")) {
-        record.imagePath = KestCommon::getSharedResourcePath(record.appid) + text;
-    } else if (KestXmlDocument::hasName(node, "launchappid")) {
+    } else if (KestXmlDocument::isElement(node, "image")) {
+        record.imagePath = __sharedResources(record.appid) + text;
+    } else if (KestXmlDocument::isElement(node, "launchappid")) {
         record.launchAppid = text;
-    } else if (KestXmlDocument::hasName(node, "launchparamkey")) {
+    } else if (KestXmlDocument::isElement(node, "launchparamkey")) {
         record.launchParamKey = text;
-    } else if (KestXmlDocument::hasName(node, "launchparamvalue")) {
+    } else if (KestXmlDocument::isElement(node, "launchparamvalue")) {
         record.launchParamValue = text;
-    } else if (KestXmlDocument::hasName(node, "attach")) {
+    } else if (KestXmlDocument::isElement(node, "attach")) {
         const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
         if (content && id && textWork.spend(record.textContents.size())) {
             const std::string placeholder = KestXmlDocument::str(id);
@@ -221,19 +234,18 @@ std::string KestContentMgr::__translateById(xmlNode* node, const std::string& do
 
 void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
     const std::string translated = __translateContents(record.textdomain, cleaned);
-    const std::string converted = __convertHrefPath(record.appid, translated);
-    record.textContents = converted.empty() ? text : converted;
+    std::string converted = __convertHrefPath(record.appid, translated);
+    record.textContents = converted.empty() ? text : std::move(converted);
 }
 
 std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
     // The directory begins with a slash itself; the text engine expects both.
-    return KestMarkup::replaceString(text, "href=file:", "href=file:/" + KestCommon::getSharedResourcePath(appid),
-                                     false);
+    return KestMarkup::replaceString(text, "href=file:", "href=file:/" + __sharedResources(appid), false);
 }
 
 void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
     KEST_BEGIN();
-    const std::string path = KestMarkup::replaceString(detailPath(record), ".xml", "-string.xml", true);
+    const std::string path = KestMarkup::replaceString(__detailPath(record), ".xml", "-string.xml", true);
     if (access(path.c_str(), F_OK) != 0) {
         return;
     }
@@ -246,27 +258,8 @@ void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
     const xmlNode* items = document.findSection("items");
     for (const xmlNode* item = items ? items->children : nullptr; item; item = item->next) {
         if (KestXmlDocument::isElement(item, "item")) {
-            __addString(item);
+            stringTable.add(item);
         }
-    }
-}
-
-void KestContentMgr::__addString(const xmlNode* item) {
-    std::string region;
-    std::string stringId;
-    std::string value;
-    for (xmlNode* node = item->children; node; node = node->next) {
-        const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
-        if (KestXmlDocument::hasName(node, "region")) {
-            region = text;
-        } else if (KestXmlDocument::hasName(node, "stringid")) {
-            stringId = text;
-        } else if (KestXmlDocument::hasName(node, "value")) {
-            value = text;
-        }
-    }
-    if (!stringId.empty()) {
-        stringTable[region + "_" + stringId] = value;
     }
 }
 
@@ -283,18 +276,7 @@ bool KestContentMgr::__isStringAvailable(const std::string& id, const std::strin
 }
 
 const std::string* KestContentMgr::__findInStringTable(const std::string& id) const {
-    const KestPlatformString language(vconf_get_str(languageKey));
-    if (!language) {
-        return nullptr;
-    }
-    // The display language names a country first ("ko_KR"), then only a language ("ko").
-    for (const size_t length : {5U, 2U}) {
-        const auto entry = stringTable.find(language.str().substr(0, length) + "_" + id);
-        if (entry != stringTable.end()) {
-            return &entry->second;
-        }
-    }
-    return nullptr;
+    return hasDisplayLanguage ? stringTable.find(displayLanguage, id) : nullptr;
 }
 
 std::string KestContentMgr::__getString(const std::string& id, const std::string& domain) {

@@ -12,6 +12,7 @@
 #include <ui_extension.h>
 
 #include <cstring>
+#include <exception>
 
 namespace {
 
@@ -148,6 +149,10 @@ const KestContentInfo* KestMainView::__recordAt(unsigned int menuIndex) const {
 
 char* KestMainView::__getRowText(void* data, Evas_Object*, const char* part) {
     const auto* row = static_cast<RowData*>(data);
+    if (!row) {
+        KEST_ERR("data is null");
+        return nullptr;
+    }
     const KestContentInfo* record = row->view->__recordAt(row->menuIndex);
     if (!record) {
         return nullptr;
@@ -163,6 +168,10 @@ char* KestMainView::__getRowText(void* data, Evas_Object*, const char* part) {
 
 Evas_Object* KestMainView::__getRowContent(void* data, Evas_Object* obj, const char* part) {
     const auto* row = static_cast<RowData*>(data);
+    if (!row) {
+        KEST_ERR("data is null");
+        return nullptr;
+    }
     const KestContentInfo* record = row->view->__recordAt(row->menuIndex);
     if (std::strcmp(part, "elm.icon.1") != 0 || !record || record->iconPath.empty()) {
         return nullptr;
@@ -184,15 +193,18 @@ void KestMainView::__deleteRow(void* data, Evas_Object*) {
     delete static_cast<RowData*>(data);
 }
 
-char* KestMainView::__getTitleText(void*, Evas_Object*, const char* part) {
+char* KestMainView::__getTitleText(void*, Evas_Object*, const char* part) try {
     if (!std::strcmp(part, "elm.text.main")) {
         return strdup(KestCommon::translateString("IDS_VOICE_BUTTON_TIPS_AND_GUIDELINES_ABB").c_str());
     }
     KEST_INFO("part:%s", part);
     return nullptr;
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
+    return nullptr;
 }
 
-void KestMainView::__selectItemCb(void* data, Evas_Object*, void* event_info) {
+void KestMainView::__selectItemCb(void* data, Evas_Object*, void* event_info) try {
     auto* item = static_cast<Elm_Object_Item*>(event_info);
     if (!item) {
         KEST_ERR("event_info is NULL");
@@ -214,9 +226,11 @@ void KestMainView::__selectItemCb(void* data, Evas_Object*, void* event_info) {
     }
     KestUsageLog::menuChosen(record->menuTitle);
     view->getNaviframe()->push(new KestContentView(index, true), nullptr, nullptr);
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
 }
 
-void KestMainView::__languageChangedCb(void* data, Evas_Object*, void*) {
+void KestMainView::__languageChangedCb(void* data, Evas_Object*, void*) try {
     auto* view = static_cast<KestMainView*>(data);
     if (!view) {
         KEST_ERR("data is null");
@@ -230,9 +244,11 @@ void KestMainView::__languageChangedCb(void* data, Evas_Object*, void*) {
             return false;
         },
         view, nullptr);
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
 }
 
-void KestMainView::__themeChangedCb(void* data) {
+void KestMainView::__themeChangedCb(void* data) try {
     auto* view = static_cast<KestMainView*>(data);
     if (!view) {
         KEST_ERR("data is null");
@@ -240,11 +256,13 @@ void KestMainView::__themeChangedCb(void* data) {
     }
     KestContentMgr::getInstance()->loadContentsList(false);
     view->__refreshRows();
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
 }
 
 void KestMainView::__packageEventCb(const char*, const char*, package_manager_event_type_e eventType,
                                     package_manager_event_state_e eventState, int, package_manager_error_e,
-                                    void* data) {
+                                    void* data) try {
     const bool changesWhatIsInstalled =
         eventType == PACKAGE_MANAGER_EVENT_TYPE_INSTALL || eventType == PACKAGE_MANAGER_EVENT_TYPE_UNINSTALL;
     if (!changesWhatIsInstalled || eventState != PACKAGE_MANAGER_EVENT_STATE_COMPLETED) {
@@ -260,4 +278,6 @@ void KestMainView::__packageEventCb(const char*, const char*, package_manager_ev
     view->contentsList = KestContentMgr::getInstance()->getContentsList();
     elm_genlist_clear(view->__genlist);
     view->__createMainList();
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
 }

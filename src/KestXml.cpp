@@ -125,7 +125,8 @@ KestXmlDocument::Result KestXmlDocument::read(const std::string& path) {
         return Result::NotRead;
     }
     xmlNode* root = xmlDocGetRootElement(document_.get());
-    if (ReferredText().lengthIn(document_.get()) > mostReferredText) {
+    // Without declarations of its own a document has no entity that stands for more than a character.
+    if (document_->intSubset && ReferredText().lengthIn(document_.get()) > mostReferredText) {
         removeReferences(root);
     }
     return root && root->children ? Result::Ok : Result::Empty;
@@ -140,11 +141,7 @@ xmlNode* KestXmlDocument::findSection(const char* name) const {
 }
 
 bool KestXmlDocument::isElement(const xmlNode* node, const char* name) {
-    return node->type == XML_ELEMENT_NODE && hasName(node, name);
-}
-
-bool KestXmlDocument::hasName(const xmlNode* node, const char* name) {
-    return node->name && xmlStrcmp(node->name, reinterpret_cast<const xmlChar*>(name)) == 0;
+    return node->type == XML_ELEMENT_NODE && xmlStrcmp(node->name, reinterpret_cast<const xmlChar*>(name)) == 0;
 }
 
 KestXmlDocument::Text KestXmlDocument::content(xmlNode* node) {

@@ -13,13 +13,13 @@ namespace architecture {
 
 using Violations = std::vector<std::string>;
 
-/** The application includes the platform's public headers, EFL, libxml2, libintl and the standard library only. */
+/** The application includes what a device has only: its services, EFL, libxml2, libintl and the standard library. */
 Violations applicationIncludesItsAllowedHeaders(const SourceTree& tree);
 
 /** The application has no conditional compilation beside include guards and defaults of what the build may set. */
 Violations applicationHasNoConditionalCode(const SourceTree& tree);
 
-/** The application has no word about where it runs beside a device, and none about tests. */
+/** The application and what builds it have no word about where it runs beside a device, and none about tests. */
 Violations applicationKnowsOfNoWorkstation(const SourceTree& tree);
 
 /** The device's fixed paths stand in inc/KestPaths.h only. */
@@ -31,7 +31,7 @@ Violations platformKnowsNoApplication(const SourceTree& tree);
 /** A layer of the platform includes layers beneath it only, and widgets only where it may. */
 Violations layersPointDown(const SourceTree& tree);
 
-/** No source or header has more than 400 lines. */
+/** No source or header has more than 320 lines. */
 Violations filesHaveOneJob(const SourceTree& tree);
 
 }  // namespace architecture

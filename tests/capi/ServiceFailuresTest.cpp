@@ -8,15 +8,18 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cerrno>
+
 namespace {
 
 using support::TemporaryDevice;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-TEST(ServiceFailures, OfAFullDiskAreACodeAndOneLineInTheLog) {
+TEST(ServiceFailures, OfAFullDiskAreACodeAndOneLineInTheLogAndOnStandardError) {
     const TemporaryDevice device;
     device->database().sql().exec("PRAGMA max_page_count = 20");
+    testing::internal::CaptureStderr();
     const std::string large(1 << 20, 'x');
     for (int attempt = 0; attempt < 3; ++attempt) {
         EXPECT_EQ(preference_set_string("key", large.c_str()), PREFERENCE_ERROR_IO_ERROR);
@@ -25,7 +28,10 @@ TEST(ServiceFailures, OfAFullDiskAreACodeAndOneLineInTheLog) {
     EXPECT_THAT(device.logMessages(),
                 ElementsAre("E DEVICE " + device.root().string() +
                             "/device.db: the disk is full (database or disk is full); free some space and try again"));
-    EXPECT_EQ(preference_set_string("key", "small"), PREFERENCE_ERROR_NONE);
+    EXPECT_EQ(vconf_set_str("key", "small"), 0);
+    EXPECT_EQ(testing::internal::GetCapturedStderr(),
+              std::string(program_invocation_short_name) + ": error: " + device.root().string() +
+                  "/device.db: the disk is full (database or disk is full); free some space and try again\n");
 }
 
 TEST(ServiceFailures, OfADamagedPageAreACodeAndOneLineInTheLog) {
@@ -74,7 +80,7 @@ TEST(ServiceFailures, WithoutADeviceAreACodeAndOneLineOnStandardError) {
     ravella_log_manager_h manager = nullptr;
     EXPECT_EQ(ravella_log_manager_create(&manager), TIZEN_ERROR_IO_ERROR);
     EXPECT_EQ(testing::internal::GetCapturedStderr(),
-              (there.path() / "file").string() +
+              std::string(program_invocation_short_name) + ": error: " + (there.path() / "file").string() +
                   ": the device's folder cannot be made: a file stands in its place; give the device another folder "
                   "with KEST_DEVICE, or make this one writable\n");
 }

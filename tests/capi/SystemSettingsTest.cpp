@@ -16,13 +16,13 @@ std::optional<std::string> setting(system_settings_key_e key) {
     return owned(value);
 }
 
-TEST(SystemSettings, GiveTheLanguageWithoutCodesetAndModifier) {
+TEST(SystemSettings, GiveTheLanguageWithoutItsCodeset) {
     const TemporaryDevice device;
     EXPECT_EQ(setting(SYSTEM_SETTINGS_KEY_LOCALE_LANGUAGE), "en_US");
     vconf_set_str("db/menu_widget/language", "sr_RS.UTF-8@latin");
-    EXPECT_EQ(setting(SYSTEM_SETTINGS_KEY_LOCALE_LANGUAGE), "sr_RS");
+    EXPECT_EQ(setting(SYSTEM_SETTINGS_KEY_LOCALE_LANGUAGE), "sr_RS@latin");
     vconf_set_str("db/menu_widget/language", "sr_RS@latin");
-    EXPECT_EQ(setting(SYSTEM_SETTINGS_KEY_LOCALE_LANGUAGE), "sr_RS");
+    EXPECT_EQ(setting(SYSTEM_SETTINGS_KEY_LOCALE_LANGUAGE), "sr_RS@latin");
 }
 
 TEST(SystemSettings, GiveTheCountryOrNothing) {

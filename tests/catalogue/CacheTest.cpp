@@ -2,6 +2,9 @@
 
 #include <app_preference.h>
 
+#include <functional>
+#include <map>
+
 using namespace manager_log;
 using kest_files::contents;
 using testing::Contains;
@@ -14,6 +17,8 @@ namespace {
 
 std::vector<std::pair<std::string, std::string>> written;
 std::vector<std::string> asked;
+/// What happens beside the load when it writes that key.
+std::map<std::string, std::function<void()>> meanwhile;
 
 }  // namespace
 
@@ -26,6 +31,8 @@ int __wrap_preference_get_string(const char* key, char** value);
 
 int __wrap_preference_set_string(const char* key, const char* value) {
     written.emplace_back(key, value);
+    if (const auto event = meanwhile.find(key); event != meanwhile.end())
+        event->second();
     return __real_preference_set_string(key, value);
 }
 
@@ -47,6 +54,19 @@ protected:
     /// A load from the files leaves this trace, one from the cache does not.
     bool loadedFromFiles() const { return testing::Value(log(), Contains(begin("__loadDetailMenu"))); }
 };
+
+TEST_F(Cache, IsNotWrittenForATipWhoseFileGoesDuringTheLoad) {
+    writeTip("<title>Title</title>");
+    const auto file = resources() / tipPath;
+    meanwhile["KestCurrentLanguage"] = [&file] { std::filesystem::remove(file); };
+    const auto records = load();
+    ASSERT_EQ(records.size(), 1U);
+    EXPECT_EQ(records[0].menuTitle, "");
+    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + file.string())));
+    EXPECT_THAT(log(), Contains(info("loadContentsList", "__loadDetailMenu failed : " + kest)));
+    EXPECT_EQ(preference("contents_tip.xml_menuTitle"), std::nullopt);
+    meanwhile.clear();
+}
 
 TEST_F(Cache, IsWrittenFieldByFieldAfterEachTip) {
     addApplication("com.example.clock");

@@ -141,19 +141,6 @@ TEST_F(Detail, MustHaveARootWithChildren) {
     EXPECT_THAT(log(), testing::Contains(info("loadContentsList", "__loadDetailMenu failed : " + kest)));
 }
 
-TEST_F(Detail, IsMissedWhenItsFolderCannotBeToldAnyMore) {
-    writeTip("<title>Title</title>");
-    // The main menu asks for the application's folder twice: for itself and to see that the detail file is there.
-    device::faults::plan("app_manager_get_shared_resource_path", -5, 100, 2);
-    const auto records = load();
-    ASSERT_EQ(records.size(), 1U);
-    EXPECT_EQ(records[0].menuTitle, "");
-    EXPECT_THAT(errors(),
-                ElementsAre(error("__loadDetailMenu",
-                                  "Failed to access: -1, " + std::string(KEST_APP_ROOT "/shared/res/") + tipPath)));
-    EXPECT_THAT(log(), testing::Contains(info("loadContentsList", "__loadDetailMenu failed : " + kest)));
-}
-
 TEST_F(Detail, IsReadAsFarAsItCanBe) {
     const KestContentInfo record = loadFile("<tip><items><item><title>Title</title><contents>half of the te");
     EXPECT_EQ(record.menuTitle, "Title");

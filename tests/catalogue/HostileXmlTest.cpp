@@ -170,3 +170,9 @@ TEST_F(HostileXml, MayHaveAMillionElements) {
                   .menuTitle,
               "Title");
 }
+
+TEST_F(HostileXml, NamesFieldsByElementsOnly) {
+    const KestContentInfo record = loadDetail(
+        file(entity("title", "Entity"), "<title>Title</title>\n<?title Instruction?>\n&title;\n<?items x?>\n"));
+    EXPECT_EQ(record.menuTitle, "Title");
+}

@@ -25,8 +25,9 @@ using testing::MatchesRegex;
 TEST(Device, TellsTheLanguageWithoutItsCodeset) {
     const TemporaryDevice device;
     EXPECT_EQ(device->language(), "en_US");
-    for (const auto& [setting, language] : {std::pair("ko_KR.UTF-8", "ko_KR"), std::pair("sr_RS@latin", "sr_RS"),
-                                            std::pair("ca_ES.UTF-8@valencia", "ca_ES"), std::pair("de", "de")}) {
+    for (const auto& [setting, language] :
+         {std::pair("ko_KR.UTF-8", "ko_KR"), std::pair("sr_RS@latin", "sr_RS@latin"),
+          std::pair("ca_ES.UTF-8@valencia", "ca_ES@valencia"), std::pair("de", "de")}) {
         device->settings().set(device::keys::language, setting);
         EXPECT_EQ(device->language(), language);
     }

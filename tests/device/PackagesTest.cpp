@@ -53,6 +53,19 @@ TEST_F(Packages, WithABrokenManifestAreLeftOutOfTheListAndToldOfWhenAskedFor) {
               manifest.string() + ":1: is not well-formed XML: Couldn't find end of Start Tag manifest line 1");
 }
 
+TEST_F(Packages, AreReadAgainWhenTheirManifestHasChanged) {
+    const auto manifest = device.preinstalled() / "com.example.one/tizen-manifest.xml";
+    for (const char* version : {"1", "1.0", "1.0.2"}) {
+        device.addPackage("com.example.one", version);
+        // As if it had been there for long.
+        std::filesystem::last_write_time(manifest, {});
+        for (int time = 0; time < 2; ++time)
+            EXPECT_EQ(version, packages.find("com.example.one").value().version);
+    }
+    std::filesystem::remove(manifest);
+    EXPECT_THAT(messageOf([&] { packages.find("com.example.one"); }), testing::HasSubstr("cannot be read"));
+}
+
 TEST_F(Packages, MustLieInAFolderOfTheirName) {
     TemporaryDevice::makePackage(device.preinstalled() / "com.example.folder", "com.example.inside");
     EXPECT_EQ(messageOf([&] { packages.find("com.example.folder"); }),

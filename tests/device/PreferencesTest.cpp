@@ -1,3 +1,4 @@
+#include "support/Message.h"
 #include "support/TemporaryDevice.h"
 
 #include <gmock/gmock.h>
@@ -5,6 +6,7 @@
 
 namespace {
 
+using support::messageOf;
 using support::TemporaryDevice;
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -58,6 +60,23 @@ TEST(Preferences, OfEveryApplicationGoInACustomisationReset) {
     device->preferences().set("com.example.b", "key", "b");
     device->preferences().clearAll();
     EXPECT_THAT(device->preferences().applications(), IsEmpty());
+}
+
+TEST(Preferences, OfAnApplicationAreWrittenNoMoreOnceAWriteHasFailed) {
+    TemporaryDevice device;
+    device->database().sql().exec("PRAGMA max_page_count = 20");
+    device->preferences().setUnlessOneFailed("com.example.app", "before", "value");
+    const std::string failure = messageOf(
+        [&] { device->preferences().setUnlessOneFailed("com.example.app", "long", std::string(1 << 20, 'x')); });
+    EXPECT_EQ(failure, device.root().string() +
+                           "/device.db: the disk is full (database or disk is full); free some space and try again");
+    EXPECT_EQ(messageOf([&] { device->preferences().setUnlessOneFailed("com.example.app", "short", "value"); }),
+              failure);
+    EXPECT_THAT(device->preferences().all("com.example.app"), ElementsAre(Pair("before", "value")));
+
+    device.reopen();
+    device->preferences().setUnlessOneFailed("com.example.app", "short", "value");
+    EXPECT_EQ(device->preferences().get("com.example.app", "short"), "value");
 }
 
 }  // namespace

@@ -14,7 +14,7 @@ TEST_F(Reset, MakesTheDeviceAsNew) {
     device::Log(device_.root() / "device.log").write(device::Log::Level::Info, "TAG", "a message");
 
     EXPECT_EQ(run({"reset"}),
-              done("the device " + root() + " is as new; removed: device.db device.log com.example.game\n"));
+              done("the device " + root() + " is as new; removed: device.db device.log toolkit com.example.game\n"));
 
     EXPECT_EQ(run({"get", "language"}), done("en_US\n"));
     EXPECT_EQ(run({"log"}), done());

@@ -1,10 +1,11 @@
+#include "FullDisk.h"
 #include "ToolTest.h"
 
 #include "support/PrivateBus.h"
 
 #include <csignal>
-#include <sys/resource.h>
 
+using test_tool::FullDisk;
 using testing::IsEmpty;
 using testing::StartsWith;
 
@@ -21,27 +22,6 @@ protected:
 };
 
 class StartRefused : public ToolTest {};
-
-/// No file may grow past `bytes` meanwhile, in this process and those that it starts: what a full disk does.
-class FullDisk {
-public:
-    explicit FullDisk(rlim_t bytes) {
-        getrlimit(RLIMIT_FSIZE, &before_);
-        signal_ = std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{bytes, before_.rlim_max};
-        setrlimit(RLIMIT_FSIZE, &limit);
-    }
-    ~FullDisk() {
-        setrlimit(RLIMIT_FSIZE, &before_);
-        std::signal(SIGXFSZ, signal_);
-    }
-    FullDisk(const FullDisk&) = delete;
-    FullDisk& operator=(const FullDisk&) = delete;
-
-private:
-    rlimit before_{};
-    void (*signal_)(int);
-};
 
 }  // namespace
 

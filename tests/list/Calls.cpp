@@ -1,11 +1,18 @@
 #include "Calls.h"
 
+#include <new>
+
 calls::Made& calls::made() {
     static Made made;
     return made;
 }
 
 using calls::made;
+
+static void throwIfPlanned() {
+    if (made().outOfMemory)
+        throw std::bad_alloc();
+}
 
 extern "C" {
 
@@ -21,6 +28,8 @@ void __real_elm_genlist_clear(Evas_Object* list);
 void __wrap_elm_genlist_clear(Evas_Object* list);
 void __real_elm_genlist_realized_items_update(Evas_Object* list);
 void __wrap_elm_genlist_realized_items_update(Evas_Object* list);
+void __real_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected);
+void __wrap_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected);
 void __real_elm_theme_extension_add(Elm_Theme* theme, const char* file);
 void __wrap_elm_theme_extension_add(Elm_Theme* theme, const char* file);
 void __real_evas_object_smart_callback_add(Evas_Object* object, const char* event, Evas_Smart_Cb func,
@@ -52,14 +61,21 @@ Elm_Object_Item* __wrap_elm_genlist_item_append(Evas_Object* list, const Elm_Gen
 }
 
 void __wrap_elm_genlist_clear(Evas_Object* list) {
+    throwIfPlanned();
     ++made().clears;
     made().rows.clear();
     __real_elm_genlist_clear(list);
 }
 
 void __wrap_elm_genlist_realized_items_update(Evas_Object* list) {
+    throwIfPlanned();
     ++made().updates;
     __real_elm_genlist_realized_items_update(list);
+}
+
+void __wrap_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected) {
+    throwIfPlanned();
+    __real_elm_genlist_item_selected_set(row, selected);
 }
 
 void __wrap_elm_theme_extension_add(Elm_Theme* theme, const char* file) {

@@ -22,6 +22,7 @@ struct Row {
 
 struct Made {
     bool failGenlist = false;  ///< elm_genlist_add() gives nothing
+    bool outOfMemory = false;  ///< clearing and updating the list, and selecting a row, throw std::bad_alloc
     std::vector<Row> rows;
     int clears = 0;
     int updates = 0;

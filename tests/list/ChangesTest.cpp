@@ -276,3 +276,15 @@ TEST_F(Shrunk, CatalogueThatGrowsAgainFillsTheRows) {
     setTheme("light");
     EXPECT_THAT(menuTexts(), ElementsAre(Pair("Name of A", "A"), Pair("Name of B", "B"), Pair("Name of C", "C")));
 }
+
+TEST_F(Change, WithoutMemoryForItLeavesTheListAsItIsAndALine) {
+    writeTips({"A", "B"});
+    start();
+    calls::made().outOfMemory = true;
+    newErrors();
+    setTheme("dark");
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("__themeChangedCb", "std::bad_alloc")));
+    publish(Type::Install, State::Completed);
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("__packageEventCb", "std::bad_alloc")));
+    EXPECT_EQ(test_ui::rows(list()).size(), 3U);
+}

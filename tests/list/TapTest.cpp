@@ -156,3 +156,14 @@ TEST_F(Tap, WithoutAViewIsAnErrorLine) {
     EXPECT_EQ(topView(), "KestMainView");
     EXPECT_THAT(usageExtras(), IsEmpty());
 }
+
+TEST_F(Tap, WithoutMemoryForItOpensNothingAndLeavesALine) {
+    writeTips({"A"});
+    start();
+    calls::made().outOfMemory = true;
+    const auto& rows = calls::made().rows;
+    rows.at(1).select(const_cast<void*>(rows.at(1).selectData), list(), menuRow(0));
+    EXPECT_THAT(newErrors(), ElementsAre(list_log::error("__selectItemCb", "std::bad_alloc")));
+    EXPECT_EQ(topView(), "KestMainView");
+    EXPECT_THAT(usageExtras(), IsEmpty());
+}

@@ -1,3 +1,4 @@
+#include "FullDisk.h"
 #include "ProgramTest.h"
 
 #include "support/PrivateBus.h"
@@ -83,4 +84,23 @@ TEST_F(Program, StartedByHandWithoutABusSaysSoAndRunsOn) {
     EXPECT_EQ(device_.run({"tap", "1", "1"}), failed("com.ravella.kest (process " + std::to_string(program.id()) +
                                                      ") does not answer; end it with 'kest-device stop'"));
     program.end(SIGTERM);
+}
+
+TEST_F(Program, OnADiskThatFillsUpDuringItsFirstStartShowsItsListAtALaterOne) {
+    start();
+    const std::vector<std::string> whole = titles();
+
+    // From a disk on which hardly the database fits to one that the last texts do not fit on.
+    for (const rlim_t kilobytes : {38, 40, 44, 60, 80}) {
+        test_tool::TestDevice full;
+        {
+            const test_tool::FullDisk disk(kilobytes * 512);
+            full.run({"start", "--headless"});
+        }
+        full.must({"stop"});
+        full.must({"start", "--headless"});
+        const std::string tree = full.must({"tree"});
+        for (const std::string& title : whole)
+            EXPECT_THAT(tree, testing::HasSubstr(title)) << kilobytes;
+    }
 }

@@ -50,6 +50,10 @@ public:
         process_.signal(SIGTERM);
         return process_.wait();
     }
+    void kill() {
+        process_.signal(SIGKILL);
+        process_.wait();
+    }
     pid_t id() const { return process_.id(); }
     /// What it wrote on standard error, but for what EFL's frame thread prints there where the machine is busy.
     std::string said() const {
@@ -210,6 +214,27 @@ TEST_F(SecondAppAlone, RunsWithoutABusAndSaysSoOnce) {
     EXPECT_EQ("second-app: there is no bus: remote control is off\n", app->said());
 }
 
+TEST_F(SecondAppAlone, StartedTwiceSaysSoAndLeavesTheFirstAlone) {
+    auto app = start();
+    ASSERT_TRUE(runs(*app));
+    auto again = start();
+    EXPECT_EQ(0, again->wait());
+    EXPECT_EQ("second-app: there is no bus: remote control is off\n"
+              "second-app: " +
+                  std::string(second) + " is running already\n",
+              again->said());
+    EXPECT_EQ(0, app->terminate());
+}
+
+TEST_F(SecondAppAlone, StartsAgainAfterItWasKilled) {
+    auto app = start();
+    ASSERT_TRUE(runs(*app));
+    app->kill();
+    auto again = start();
+    ASSERT_TRUE(runs(*again));
+    EXPECT_EQ(0, again->terminate());
+}
+
 TEST_F(SecondAppAlone, KeepsTheToolkitsFilesInTheDevice) {
     auto app = start();
     ASSERT_TRUE(runs(*app));
@@ -218,13 +243,22 @@ TEST_F(SecondAppAlone, KeepsTheToolkitsFilesInTheDevice) {
     EXPECT_TRUE(fs::is_directory(folder() / "toolkit"));
 }
 
-TEST_F(SecondAppAlone, WithoutADisplaySaysSoAndRunsOn) {
+TEST_F(SecondAppAlone, EndsWhereThereIsNoDisplay) {
     Environment noEngine("ELM_ENGINE", std::nullopt);
+    auto app = start();
+    EXPECT_EQ(1, app->wait());
+    EXPECT_EQ("second-app: error: there is no display to show a window on (DISPLAY and WAYLAND_DISPLAY are not set); "
+              "ELM_ENGINE=buffer draws into memory\n",
+              app->said());
+}
+
+TEST_F(SecondAppAlone, RunsOnWhereTheDisplayShowsNoWindow) {
+    Environment noEngine("ELM_ENGINE", std::nullopt);
+    Environment unreachable("DISPLAY", (home_.path() / "no-server").string() + ":0");
     auto app = start();
     ASSERT_TRUE(runs(*app));
     EXPECT_EQ(0, app->terminate());
-    EXPECT_EQ("second-app: error: there is no display to show a window on (DISPLAY and WAYLAND_DISPLAY are not set); "
-              "ELM_ENGINE=buffer draws into memory\n"
+    EXPECT_EQ("second-app: error: no window could be made on the display\n"
               "second-app: there is no bus: remote control is off\n",
               app->said());
 }

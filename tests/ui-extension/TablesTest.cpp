@@ -97,6 +97,8 @@ INSTANTIATE_TEST_SUITE_P(
                 ":2: error: \"#12345G\" is no colour; write #RRGGBB or #RRGGBBAA"},
         Refusal{"Sign", "<color_table>\n<color class=\"a\" light=\"#-1+1 1\" dark=\"#000000\"/>\n</color_table>",
                 ":2: error: \"#-1+1 1\" is no colour; write #RRGGBB or #RRGGBBAA"},
+        Refusal{"MinusNought", "<color_table>\n<color class=\"a\" light=\"#-0-0-0\" dark=\"#000000\"/>\n</color_table>",
+                ":2: error: \"#-0-0-0\" is no colour; write #RRGGBB or #RRGGBBAA"},
         Refusal{"Twice",
                 "<color_table>\n<color class=\"a\" light=\"#FFFFFF\" dark=\"#000000\"/>\n"
                 "<color class=\"a\" light=\"#FFFFFF\" dark=\"#000000\"/>\n</color_table>",

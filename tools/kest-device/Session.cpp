@@ -1,5 +1,7 @@
 #include "Session.h"
 
+#include "device/ToolkitFiles.h"
+
 namespace tool {
 
 const device::Folder& Session::folder() {
@@ -23,6 +25,8 @@ device::Bus* Session::bus() {
 }
 
 device::Bus* Session::reconnect() {
+    // The bus is reached through EFL, which would keep files in the user's home.
+    device::keepToolkitFilesIn(folder());
     bus_ = device::Bus::connect(folder());
     busSought_ = true;
     return bus_.get();

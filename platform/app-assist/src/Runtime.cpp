@@ -7,6 +7,7 @@
 #include <app-assist/WWindow.h>
 #include <device/Error.h>
 #include <device/Keys.h>
+#include <device/StandardError.h>
 #include <efl-answers/DisplayLanguage.h>
 #include <uxt/Theme.h>
 
@@ -26,10 +27,6 @@ void say(const std::string& line) {
     std::fprintf(stderr, "%s: %s\n", program_invocation_short_name, line.c_str());
 }
 
-void sayError(const std::string& line) {
-    say("error: " + line);
-}
-
 /// "com.example.app" gives "app": the domain of the application's own texts.
 std::string textDomain(const std::string& appId) {
     return appId.substr(appId.rfind('.') + 1);
@@ -40,11 +37,10 @@ bool isSet(const char* variable) {
     return value && *value;
 }
 
-std::string whyNoWindow() {
-    if (isSet("DISPLAY") || isSet("WAYLAND_DISPLAY") || isSet("ELM_ENGINE"))
-        return "no window could be made on the display";
-    return "there is no display to show a window on (DISPLAY and WAYLAND_DISPLAY are not set); "
-           "ELM_ENGINE=buffer draws into memory";
+void requireDisplay() {
+    if (!isSet("DISPLAY") && !isSet("WAYLAND_DISPLAY") && !isSet("ELM_ENGINE"))
+        throw device::Error("there is no display to show a window on (DISPLAY and WAYLAND_DISPLAY are not set); "
+                            "ELM_ENGINE=buffer draws into memory");
 }
 
 }  // namespace
@@ -57,22 +53,25 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
     try {
         extras_ = LaunchRequest::parse(argc, argv);
     } catch (const std::invalid_argument& error) {
-        sayError(error.what());
+        device::sayErrorOnce(error.what());
         return 2;
     }
     try {
         device_ = &device::Device::current();
+        requireDisplay();
         startToolkit(argc, argv);
         if (!createApplication(argc, argv)) {
-            sayError("the application could not start");
+            device::sayErrorOnce("the application could not start");
             return 1;
         }
         if (const auto status = joinBus())
             return status;
+        if (const auto status = claimInstance())
+            return status;
         queueFirstRequest();
         return std::nullopt;
     } catch (const std::exception& error) {
-        sayError(error.what());
+        device::sayErrorOnce(error.what());
         return 1;
     }
 }
@@ -90,7 +89,7 @@ void Runtime::startToolkit(int argc, char** argv) {
     useTheme();
     windowAhead_.emplace();
     if (!windowAhead_->exists())
-        sayError(whyNoWindow());
+        device::sayErrorOnce("no window could be made on the display");
 }
 
 bool Runtime::createApplication(int argc, char** argv) {
@@ -112,12 +111,11 @@ std::optional<int> Runtime::joinBus() {
     }
     switch (presence_->result()) {
     case BusPresence::Result::OtherDevice:
-        sayError("the bus belongs to the device in " + presence_->otherFolder() + ", not to the one in " +
-                 device_->folder().root().string() + "; give each device a bus of its own");
+        device::sayErrorOnce("the bus belongs to the device in " + presence_->otherFolder() + ", not to the one in " +
+                             device_->folder().root().string() + "; give each device a bus of its own");
         return 1;
     case BusPresence::Result::RunningAlready:
-        say(device_->application().id + " is running already");
-        return 0;
+        return sayRunning();
     case BusPresence::Result::NoBus:
         say("there is no bus: remote control is off");
         return std::nullopt;
@@ -125,6 +123,16 @@ std::optional<int> Runtime::joinBus() {
         return std::nullopt;
     }
     return std::nullopt;
+}
+
+std::optional<int> Runtime::claimInstance() {
+    instance_.emplace(*device_);
+    return instance_->isHeld() ? std::nullopt : std::optional(sayRunning());
+}
+
+int Runtime::sayRunning() const {
+    say(device_->application().id + " is running already");
+    return 0;
 }
 
 void Runtime::queueFirstRequest() {
@@ -143,7 +151,7 @@ void Runtime::deliver(const LaunchRequest::Extras& extras) {
     const bool first = std::exchange(firstLaunch_, false);
     app_.onAppControl(request.handle(), first);
     if (first)
-        app_.setInSight(true);
+        app_.beginSight();
 }
 
 void Runtime::followDevice() {
@@ -172,11 +180,12 @@ void Runtime::useTheme() const {
 void Runtime::end() {
     if (firstRequest_)
         ecore_job_del(std::exchange(firstRequest_, nullptr));
-    app_.setInSight(false);
+    app_.endSight();
     if (std::exchange(created_, false))
         guarded("onTerminate", [this] { app_.onTerminate(); });
     settings_.reset();
     presence_.reset();
+    instance_.reset();
     app_.window_.reset();
     UiTimers::endAll();
     windowAhead_.reset();

@@ -2,6 +2,7 @@
 
 #include "BusPresence.h"
 #include "DisplayWindow.h"
+#include "InstanceLock.h"
 #include "LaunchRequest.h"
 #include "Toolkit.h"
 
@@ -31,6 +32,10 @@ private:
     void startToolkit(int argc, char** argv);
     bool createApplication(int argc, char** argv);
     std::optional<int> joinBus();
+    /// An exit status where another process is the application.
+    std::optional<int> claimInstance();
+    /// The exit status of a second process.
+    int sayRunning() const;
     void queueFirstRequest();
     void deliver(const LaunchRequest::Extras& extras);
     void followDevice();
@@ -44,6 +49,7 @@ private:
     std::optional<Toolkit> toolkit_;
     std::optional<PreinitializedWindow> windowAhead_;
     std::optional<BusPresence> presence_;
+    std::optional<InstanceLock> instance_;
     device::Events::Subscription settings_;
     LaunchRequest::Extras extras_;
     Ecore_Job* firstRequest_ = nullptr;

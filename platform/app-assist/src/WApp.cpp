@@ -50,8 +50,18 @@ void WApp::attachWindow(WWindow* window) {
         [](void* app, Evas_Object*, void*) { static_cast<WApp*>(app)->setInSight(true); }, this);
 }
 
+void WApp::beginSight() {
+    watchesWindow_ = true;
+    setInSight(true);
+}
+
+void WApp::endSight() {
+    setInSight(false);
+    watchesWindow_ = false;
+}
+
 void WApp::setInSight(bool inSight) {
-    if (std::exchange(inSight_, inSight) == inSight)
+    if (!watchesWindow_ || std::exchange(inSight_, inSight) == inSight)
         return;
     guarded("onResume or onPause", [&] { inSight ? onResume() : onPause(); });
 }

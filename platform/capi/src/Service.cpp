@@ -1,19 +1,27 @@
 #include "Service.h"
 
-#include <cstdio>
+#include "device/StandardError.h"
+
 #include <set>
+#include <unistd.h>
 
 namespace service {
 namespace {
 
 constexpr std::size_t mostReports = 100;  // a failure whose text differs each time must not flood the log
 
+/// Where there is no log, or it cannot be written either, standard error is left; a terminal shows the log's lines
+/// already.
 void write(const std::string& text) {
+    bool shown = false;
     try {
-        device::Device::current().log().write(device::Log::Level::Error, "DEVICE", text);
+        shown = device::Device::current().log().write(device::Log::Level::Error, "DEVICE", text) &&
+                isatty(STDERR_FILENO) == 1;
     } catch (const std::exception&) {
-        std::fprintf(stderr, "%s\n", text.c_str());
+        shown = false;
     }
+    if (!shown)
+        device::sayErrorOnce(text);
 }
 
 }  // namespace

@@ -62,8 +62,9 @@ const Screen& Device::screen() const {
 }
 
 std::string Device::language() const {
-    const std::string language = settings_.get(keys::language).value_or(keys::defaultLanguage);
-    return language.substr(0, language.find_first_of(".@"));
+    std::string language = settings_.get(keys::language).value_or(keys::defaultLanguage);
+    const auto codeset = std::min(language.find('.'), language.size());
+    return language.erase(codeset, std::min(language.find('@', codeset), language.size()) - codeset);
 }
 
 std::vector<std::string> Device::languages() const {

@@ -90,27 +90,6 @@ bool writeWhole(int file, const std::string& line) {
     return written == static_cast<ssize_t>(line.size());
 }
 
-Descriptor openLog(const std::filesystem::path& file) {
-    return Descriptor(open(file.c_str(), O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK, 0600));
-}
-
-/// Moves a file that is full out of the way. Whoever holds the lock does it; the others go on in the old file.
-void rotate(const std::filesystem::path& file, const Descriptor& opened) {
-    struct stat held {};
-    struct stat named {};
-    if (flock(opened.get(), LOCK_EX | LOCK_NB) != 0)
-        return;
-    if (fstat(opened.get(), &held) == 0 && stat(file.c_str(), &named) == 0 && held.st_ino == named.st_ino &&
-        held.st_dev == named.st_dev)
-        std::rename(file.c_str(), (file.string() + ".1").c_str());
-}
-
-bool isFull(const Descriptor& file, std::size_t more) {
-    struct stat status {};
-    return fstat(file.get(), &status) == 0 && status.st_size > 0 &&
-           status.st_size + static_cast<off_t>(more) > largestFile;
-}
-
 void echo(const std::string& line) {
     if (isatty(STDERR_FILENO) == 1)
         writeWhole(STDERR_FILENO, line);
@@ -118,17 +97,60 @@ void echo(const std::string& line) {
 
 }  // namespace
 
-Log::Log(std::filesystem::path file) : file_(std::move(file)) {}
+/// The file as this process last opened it. Other processes may move it away or remove it at any time.
+class Log::OpenFile {
+public:
+    /// The file that bears the name now, with room for `more` bytes; none when it cannot be opened.
+    const Descriptor& withRoom(const std::filesystem::path& file, std::size_t more) {
+        if (!isCurrent(file))
+            open(file);
+        if (descriptor_ && isFull(more)) {
+            moveAway(file);
+            open(file);
+        }
+        return descriptor_;
+    }
+
+private:
+    void open(const std::filesystem::path& file) {
+        descriptor_ = Descriptor(::open(file.c_str(), O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK, 0600));
+        if (descriptor_ && fstat(descriptor_.get(), &status_) != 0)
+            descriptor_ = Descriptor();
+    }
+
+    bool isCurrent(const std::filesystem::path& file) {
+        struct stat named {};
+        if (!descriptor_ || stat(file.c_str(), &named) != 0 || named.st_ino != status_.st_ino ||
+            named.st_dev != status_.st_dev)
+            return false;
+        status_ = named;
+        return true;
+    }
+
+    bool isFull(std::size_t more) const {
+        return status_.st_size > 0 && status_.st_size + static_cast<off_t>(more) > largestFile;
+    }
+
+    /// Whoever holds the lock does it; the others go on in the old file.
+    void moveAway(const std::filesystem::path& file) {
+        if (flock(descriptor_.get(), LOCK_EX | LOCK_NB) == 0 && isCurrent(file))
+            std::rename(file.c_str(), (file.string() + ".1").c_str());
+    }
+
+    Descriptor descriptor_;
+    struct stat status_ {};
+};
+
+Log::Log(std::filesystem::path file) : file_(std::move(file)), open_(std::make_unique<OpenFile>()) {}
+
+Log::~Log() = default;
 
 bool Log::write(Level level, std::string_view tag, std::string_view message) noexcept {
     try {
         const std::string line = formatted(level, tag, message);
         echo(line);
-        Descriptor file = openLog(file_);
-        if (file && isFull(file, line.size())) {
-            rotate(file_, file);
-            file = openLog(file_);
-        }
+        const std::lock_guard lock(mutex_);
+        const Descriptor& file = open_->withRoom(file_, line.size());
         return file && writeWhole(file.get(), line);
     } catch (const std::exception&) {
         return false;

@@ -1,6 +1,7 @@
 #include "device/Packages.h"
 
 #include "Files.h"
+#include "ManifestMemory.h"
 #include "PackageFiles.h"
 #include "device/BusName.h"
 #include "device/Database.h"
@@ -102,7 +103,10 @@ void removeRemains(Database& database, const std::filesystem::path& apps) {
 
 Packages::Packages(Database& database, Events& events, const Folder& folder,
                    std::vector<std::filesystem::path> preinstalled)
-    : database_(database), events_(events), folder_(folder), preinstalled_(std::move(preinstalled)) {}
+    : database_(database), events_(events), folder_(folder), preinstalled_(std::move(preinstalled)),
+      manifests_(std::make_unique<ManifestMemory>()) {}
+
+Packages::~Packages() = default;
 
 std::optional<std::filesystem::path> Packages::rootOf(const std::string& id) const {
     if (!BusName::isValid(id))
@@ -120,7 +124,7 @@ std::optional<std::filesystem::path> Packages::rootOf(const std::string& id) con
 }
 
 Package Packages::read(const std::string& id, const std::filesystem::path& root) const {
-    Package package = readManifest(root);
+    Package package = manifests_->read(root);
     if (package.id != id)
         throw Error((root / "tizen-manifest.xml").string() + ": the package's id \"" + package.id +
                     "\" differs from the name of its folder; they must be equal");

@@ -23,6 +23,17 @@ void Preferences::set(const std::string& appId, const std::string& key, const st
     });
 }
 
+void Preferences::setUnlessOneFailed(const std::string& appId, const std::string& key, const std::string& value) {
+    if (failure_)
+        throw Error(*failure_);
+    try {
+        set(appId, key, value);
+    } catch (const Error& failure) {
+        failure_ = failure;
+        throw;
+    }
+}
+
 void Preferences::clear(const std::string& appId) {
     database_.guarded([&] { database_.query("DELETE FROM preference WHERE app_id = ?", appId)->exec(); });
 }

@@ -1,14 +1,15 @@
 #include <device/Device.h>
-#include <device/Error.h>
 
 #include <Elementary.h>
+
+#include <exception>
 
 namespace {
 
 const device::Screen& deviceScreen() {
     try {
         return device::Device::current().screen();
-    } catch (const device::Error&) {
+    } catch (const std::exception&) {
         // Without a device, the display that a fresh one has.
         return device::Screen::named("");
     }

@@ -6,9 +6,10 @@ namespace uxt {
 namespace {
 
 std::optional<int> hexByte(std::string_view digits) {
-    int value = 0;
+    // A type without a sign, since a minus is no digit here.
+    unsigned char value = 0;
     const auto [end, error] = std::from_chars(digits.data(), digits.data() + 2, value, 16);
-    if (error != std::errc() || end != digits.data() + 2 || value < 0)
+    if (error != std::errc() || end != digits.data() + 2)
         return std::nullopt;
     return value;
 }

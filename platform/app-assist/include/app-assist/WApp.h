@@ -19,14 +19,14 @@ public:
     /// Makes the process an application of the device (its language, text domain, display, theme and bus), runs
     /// onStart, onCreate, the first onAppControl from inside the main loop, and the main loop until it ends,
     /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request.
-    /// Returns the process's exit status: 0; 1 when the device cannot be opened, when the bus has another device,
-    /// or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on standard error.
+    /// Returns the process's exit status: 0; 1 when the device cannot be opened, when there is no display, when the
+    /// bus has another device, or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on standard error.
     /// An application that is running already on the same device is said too, and gives 0.
     int start(int argc, char** argv);
 
     /// Takes the window over and creates it. The window ends the application when it is closed.
     void attachWindow(WWindow* window);
-    /// Null until attachWindow(), and after the window is gone.
+    /// The window as it was attached; null before that. It stays when its Evas object could not be made or is gone.
     WWindow* getWindow() const;
 
     /// The process's application object; null outside its life.
@@ -47,9 +47,13 @@ protected:
 private:
     friend class Runtime;
     void setInSight(bool inSight);
+    /// What the window tells counts from the first launch request until the application ends.
+    void beginSight();
+    void endSight();
 
     std::unique_ptr<WWindow> window_;
     bool inSight_ = false;
+    bool watchesWindow_ = false;
 };
 
 }  // namespace app_assist

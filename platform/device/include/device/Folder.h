@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
 
 namespace device {
 
@@ -37,6 +38,8 @@ public:
     std::filesystem::path busSocket() const { return root_ / "bus"; }
     std::filesystem::path busAddress() const { return root_ / "bus.address"; }
     std::filesystem::path busProcess() const { return root_ / "bus.pid"; }
+    /// Held by the process that is the application.
+    std::filesystem::path applicationLock(const std::string& appId) const { return root_ / (appId + ".lock"); }
 
 private:
     std::filesystem::path root_;

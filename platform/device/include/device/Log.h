@@ -1,6 +1,8 @@
 #pragma once
 
 #include <filesystem>
+#include <memory>
+#include <mutex>
 #include <string>
 #include <string_view>
 
@@ -18,6 +20,7 @@ public:
     enum class Level { Debug = 3, Info = 4, Warning = 5, Error = 6, Fatal = 7 };
 
     explicit Log(std::filesystem::path file);
+    ~Log();
 
     /// False when the line could not be written (disk full, no such folder). Never throws.
     bool write(Level level, std::string_view tag, std::string_view message) noexcept;
@@ -25,7 +28,12 @@ public:
     const std::filesystem::path& file() const { return file_; }
 
 private:
+    class OpenFile;
+
     std::filesystem::path file_;
+    /// EFL writes from its threads too.
+    std::mutex mutex_;
+    std::unique_ptr<OpenFile> open_;
 };
 
 }  // namespace device

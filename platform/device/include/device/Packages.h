@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
@@ -10,6 +11,7 @@ namespace device {
 class Database;
 class Events;
 class Folder;
+class ManifestMemory;
 struct PackageEvent;
 
 /// What a package's tizen-manifest.xml says of it, and where it lies.
@@ -29,11 +31,12 @@ struct Package {
 Package readManifest(const std::filesystem::path& root);
 
 /// The packages of the device: those that the build ships, read where they lie, as changed by what was
-/// installed and removed on this device. Keeps no copy of anything.
+/// installed and removed on this device. Of what was read it keeps only manifests, until their files change.
 /// All throw Error when the database fails.
 class Packages {
 public:
     Packages(Database& database, Events& events, const Folder& folder, std::vector<std::filesystem::path> preinstalled);
+    ~Packages();
 
     /// The package's folder, without reading its manifest; nullopt when it is not installed.
     std::optional<std::filesystem::path> rootOf(const std::string& id) const;
@@ -64,6 +67,7 @@ private:
     Events& events_;
     const Folder& folder_;
     std::vector<std::filesystem::path> preinstalled_;
+    std::unique_ptr<ManifestMemory> manifests_;
 };
 
 }  // namespace device

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "device/Error.h"
+
 #include <map>
 #include <optional>
 #include <string>
@@ -16,6 +18,9 @@ public:
 
     std::optional<std::string> get(const std::string& appId, const std::string& key) const;
     void set(const std::string& appId, const std::string& key, const std::string& value);
+    /// For an application, whose values belong together: as set(), until a write has failed, and from then on that
+    /// failure again. A full disk would else keep the short values and lose the long ones.
+    void setUnlessOneFailed(const std::string& appId, const std::string& key, const std::string& value);
     void clear(const std::string& appId);
     /// What a customisation reset does: every application starts anew.
     void clearAll();
@@ -25,6 +30,7 @@ public:
 
 private:
     Database& database_;
+    std::optional<Error> failure_;
 };
 
 }  // namespace device

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <libxml/tree.h>
+
+#include <map>
+#include <string>
+
+/// The translations that the string files of the catalogue give, by language and string id. Never forgets one: a
+/// later file of the same language and id overwrites it.
+class KestStringTable {
+public:
+    /// Takes over the "item" element of a string file: its "region", "stringid" and "value". One without an id is
+    /// left out.
+    void add(const xmlNode* item);
+
+    /// `language` as the setting has it ("ko_KR.UTF-8"): the country's entry comes before the language's.
+    /// Null when there is neither.
+    const std::string* find(const std::string& language, const std::string& id) const;
+
+private:
+    /// By region + "_" + string id.
+    std::map<std::string, std::string> values_;
+};
