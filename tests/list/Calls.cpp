@@ -1,5 +1,7 @@
 #include "Calls.h"
 
+#include <ravella-log-client.h>
+
 #include <new>
 
 calls::Made& calls::made() {
@@ -30,6 +32,10 @@ void __real_elm_genlist_realized_items_update(Evas_Object* list);
 void __wrap_elm_genlist_realized_items_update(Evas_Object* list);
 void __real_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected);
 void __wrap_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected);
+void __real_elm_object_item_domain_translatable_part_text_set(Elm_Object_Item* item, const char* part,
+                                                              const char* domain, const char* text);
+void __wrap_elm_object_item_domain_translatable_part_text_set(Elm_Object_Item* item, const char* part,
+                                                              const char* domain, const char* text);
 void __real_elm_theme_extension_add(Elm_Theme* theme, const char* file);
 void __wrap_elm_theme_extension_add(Elm_Theme* theme, const char* file);
 void __real_evas_object_smart_callback_add(Evas_Object* object, const char* event, Evas_Smart_Cb func,
@@ -48,6 +54,10 @@ int __real_package_manager_unset_event_cb(package_manager_h manager);
 int __wrap_package_manager_unset_event_cb(package_manager_h manager);
 int __real_package_manager_destroy(package_manager_h manager);
 int __wrap_package_manager_destroy(package_manager_h manager);
+int __real_ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
+                                      ravella_log_insert_cb callback, void* data, int* request);
+int __wrap_ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
+                                      ravella_log_insert_cb callback, void* data, int* request);
 
 Evas_Object* __wrap_elm_genlist_add(Evas_Object* parent) {
     return made().failGenlist ? nullptr : __real_elm_genlist_add(parent);
@@ -76,6 +86,12 @@ void __wrap_elm_genlist_realized_items_update(Evas_Object* list) {
 void __wrap_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool selected) {
     throwIfPlanned();
     __real_elm_genlist_item_selected_set(row, selected);
+}
+
+void __wrap_elm_object_item_domain_translatable_part_text_set(Elm_Object_Item* item, const char* part,
+                                                              const char* domain, const char* text) {
+    made().translatableTexts.push_back(std::string(part) + ": " + text + " of " + domain);
+    __real_elm_object_item_domain_translatable_part_text_set(item, part, domain, text);
 }
 
 void __wrap_elm_theme_extension_add(Elm_Theme* theme, const char* file) {
@@ -120,5 +136,12 @@ int __wrap_package_manager_unset_event_cb(package_manager_h manager) {
 int __wrap_package_manager_destroy(package_manager_h manager) {
     made().registrations.emplace_back("package destroy");
     return __real_package_manager_destroy(manager);
+}
+
+int __wrap_ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
+                                      ravella_log_insert_cb callback, void* data, int* request) {
+    if (made().whenRecorded)
+        made().whenRecorded();
+    return __real_ravella_log_manager_insert(handle, uri, record, callback, data, request);
 }
 }

@@ -4,6 +4,7 @@
 #include <package_manager.h>
 #include <ui_extension.h>
 
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
@@ -27,6 +28,9 @@ struct Made {
     int clears = 0;
     int updates = 0;
     std::vector<std::string> themeExtensions;
+    /// Texts that follow the language: "<part>: <id> of <domain>".
+    std::vector<std::string> translatableTexts;
+    std::function<void()> whenRecorded;                   ///< called before each usage record is written
     std::map<std::string, Evas_Smart_Cb> smartCallbacks;  ///< by event, the last one
     uxt_theme_changed_cb themeCallback = nullptr;
     package_manager_event_cb packageCallback = nullptr;

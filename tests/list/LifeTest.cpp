@@ -18,15 +18,6 @@ struct View : KestMainView {
     using KestMainView::onPushToNaviframe;
 };
 
-/// A page of no interest.
-class OtherView : public app_assist::WView {
-public:
-    const char* getClassName() const override { return "OtherView"; }
-
-protected:
-    Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_button_add(parent); }
-};
-
 }  // namespace
 
 class Life : public ListTest {
@@ -114,6 +105,22 @@ TEST_F(Life, SlidesInBeneathWhenItIsPushedSo) {
     settle();
     EXPECT_EQ(topView(), "KestMainView");
     EXPECT_EQ(test_ui::rows(list()).size(), 2U);
+}
+
+TEST_F(Life, SlidesInRightBeneathTheTopView) {
+    writeTips({"A"});
+    startEmpty();
+    pushOtherView();
+    pushOtherView();
+    auto* view = new KestMainView(false);
+    naviframe().push(view, nullptr, nullptr);
+    EXPECT_EQ(topView(), "OtherView");
+    elm_naviframe_item_pop(naviframe().getEvasObj());
+    settle();
+    EXPECT_EQ(naviframe().getTopView(), view);
+    elm_naviframe_item_pop(naviframe().getEvasObj());
+    settle();
+    EXPECT_EQ(topView(), "OtherView");
 }
 
 TEST_F(Life, EndsWithoutAParent) {

@@ -42,6 +42,12 @@ std::string ListTest::drawIcon(unsigned int colour) const {
     return icon;
 }
 
+void ListTest::pushOtherView() {
+    naviframe().push(new OtherView, nullptr, nullptr);
+    settle();
+    ASSERT_EQ(topView(), "OtherView");
+}
+
 void ListTest::tap(Elm_Object_Item* row) {
     screen().tap(test_ui::rowGeometry(row).middle());
 }

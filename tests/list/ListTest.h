@@ -31,6 +31,11 @@ protected:
     /// Gives the application an icon that is a square of that colour (0xRRGGBB), and returns its path.
     std::string drawIcon(unsigned int colour) const;
 
+    /// Pushes a page of no interest, and waits until it stands.
+    void pushOtherView();
+    /// How many views the naviframe holds.
+    unsigned int levels() { return eina_list_count(elm_naviframe_items_get(naviframe().getEvasObj())); }
+
     void tap(Elm_Object_Item* row);
     /// Taps the menu's row and waits until the pager stands.
     void openPager(std::size_t menu = 0);
@@ -39,6 +44,15 @@ protected:
     std::vector<std::string> usageExtras() const;
 
     std::vector<kest_log::Line> newErrors() { return kest_log::ofLevel('E', newLog()); }
+};
+
+/// A page of no interest.
+class OtherView : public app_assist::WView {
+public:
+    const char* getClassName() const override { return "OtherView"; }
+
+protected:
+    Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_button_add(parent); }
 };
 
 /// Lines of the list's source file.

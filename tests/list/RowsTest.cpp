@@ -164,6 +164,20 @@ TEST_F(Rows, LieBelowTheApplicationsName) {
     EXPECT_EQ(elm_object_item_part_content_get(item, "elm.swallow.next_btn"), nullptr);
 }
 
+TEST_F(Rows, LieBelowANameOfTheDomainThatHasIt) {
+    start();
+    EXPECT_THAT(calls::made().translatableTexts,
+                ElementsAre("elm.text.title: IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME of kest"));
+}
+
+TEST_F(Rows, LieBelowANameOfContactsWhereTheApplicationHasNone) {
+    // There are no texts of the application's own in this language.
+    setLanguage("de_DE.UTF-8");
+    start();
+    EXPECT_THAT(calls::made().translatableTexts,
+                ElementsAre("elm.text.title: IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME of contacts"));
+}
+
 TEST_F(Rows, MayBe15000) {
     writeDetail("<title>Title</title>");
     writeMenus(std::vector<Menu>(15000));

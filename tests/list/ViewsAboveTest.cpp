@@ -1,0 +1,54 @@
+#include "ListTest.h"
+
+#include "KestMainView.h"
+
+using testing::IsEmpty;
+
+/// The list beneath other views.
+class ViewsAbove : public ListTest {
+protected:
+    void startBeneathTwoViews() {
+        writeTips({"A"});
+        start();
+        pushOtherView();
+        pushOtherView();
+        ASSERT_EQ(levels(), 3U);
+    }
+};
+
+TEST_F(ViewsAbove, AreClosedOneAtALanguageChange) {
+    startBeneathTwoViews();
+    setLanguage("ko_KR.UTF-8");
+    settle();
+    EXPECT_EQ(topView(), "OtherView");
+    EXPECT_EQ(levels(), 2U);
+}
+
+TEST_F(ViewsAbove, AreClosedOneAtAPackageChange) {
+    startBeneathTwoViews();
+    device()->events().publishPackage(
+        {"com.example.other", device::PackageEvent::Type::Install, device::PackageEvent::State::Completed, 100, 0});
+    settle();
+    EXPECT_EQ(topView(), "OtherView");
+    EXPECT_EQ(levels(), 2U);
+}
+
+TEST_F(ViewsAbove, RemainWhenTheListGoesInTheMidstOfALanguageChange) {
+    writeTips({"A"});
+    start();
+    pushOtherView();
+    auto* view = new KestMainView(false);
+    naviframe().push(view, nullptr, nullptr);
+    pushOtherView();
+    newLog();
+    calls::made().updates = 0;
+    const auto changed = calls::made().smartCallbacks.at("language,changed");
+    test_ui::inMainLoop([&] {
+        changed(view, nullptr, nullptr);
+        elm_object_item_del(view->getNaviItem());
+    });
+    settle();
+    EXPECT_EQ(calls::made().updates, 0);
+    EXPECT_THAT(newLog(), IsEmpty());
+    EXPECT_EQ(topView(), "OtherView");
+}
