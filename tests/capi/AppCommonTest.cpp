@@ -22,6 +22,14 @@ TEST(AppCommon, KnowsTheApplicationOfTheProcess) {
     EXPECT_EQ(app_get_id(nullptr), TIZEN_ERROR_INVALID_PARAMETER);
 }
 
+TEST(AppCommon, NumbersTheEventsAsTheDeviceDoes) {
+    EXPECT_EQ(static_cast<int>(APP_EVENT_LOW_MEMORY), 0);
+    EXPECT_EQ(static_cast<int>(APP_EVENT_LOW_BATTERY), 1);
+    EXPECT_EQ(static_cast<int>(APP_EVENT_LANGUAGE_CHANGED), 2);
+    EXPECT_EQ(static_cast<int>(APP_EVENT_DEVICE_ORIENTATION_CHANGED), 3);
+    EXPECT_EQ(static_cast<int>(APP_EVENT_REGION_FORMAT_CHANGED), 4);
+}
+
 std::optional<std::string> sharedPath(const char* id) {
     char* path = nullptr;
     EXPECT_EQ(app_manager_get_shared_resource_path(id, &path), APP_MANAGER_ERROR_NONE);

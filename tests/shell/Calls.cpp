@@ -1,6 +1,8 @@
 #include "Calls.h"
 
 #include <Elementary.h>
+#include <app-assist/WApp.h>
+#include <app-assist/WAppEventHandler.h>
 #include <app_extension.h>
 #include <app_resource_manager.h>
 #include <ravella-log-client.h>
@@ -8,12 +10,14 @@
 
 #include <algorithm>
 #include <sstream>
+#include <utility>
 
 namespace {
 
 std::vector<std::string> all;
 std::set<std::string> failing;
 bool rotationSupported = false;
+std::function<void()> lookWhenTheLanguageIsSet;
 
 std::string orNull(const char* text) {
     return text ? text : "null";
@@ -56,6 +60,10 @@ void calls::fail(const std::string& name) {
     failing.insert(name);
 }
 
+void calls::whenTheLanguageIsSet(std::function<void()> look) {
+    lookWhenTheLanguageIsSet = std::move(look);
+}
+
 void calls::setRotationSupported(bool supported) {
     rotationSupported = supported;
 }
@@ -65,6 +73,22 @@ void calls::setRotationSupported(bool supported) {
     extern "C" result __real_##name(__VA_ARGS__);                                                                      \
     extern "C" result __wrap_##name(__VA_ARGS__);                                                                      \
     result __wrap_##name(__VA_ARGS__)
+
+// WAppEventHandler::addEventHandler(), which the linker knows by this name. The object that it is called on goes first.
+#define ADD_EVENT_HANDLER                                                                                              \
+    "_ZN10app_assist16WAppEventHandler15addEventHandlerE16app_event_type_eSt8functionIFvP14app_event_infoPvEES5_"
+
+using EventHandler = app_assist::WAppEventHandler;
+void addEventHandler(EventHandler* self, app_event_type_e type, EventHandler::Handler handler,
+                     void* data) __asm__("__real_" ADD_EVENT_HANDLER);
+void addAndNoteEventHandler(EventHandler* self, app_event_type_e type, EventHandler::Handler handler,
+                            void* data) __asm__("__wrap_" ADD_EVENT_HANDLER);
+
+void addAndNoteEventHandler(EventHandler* self, app_event_type_e type, EventHandler::Handler handler, void* data) {
+    const bool isApplication = data && data == app_assist::WApp::getInstance();
+    note("addEventHandler", type, isApplication ? "application" : orNull(data, "data"));
+    addEventHandler(self, type, std::move(handler), data);
+}
 
 CALL(void*, app_get_preinitialized_window, const char* name) {
     note("app_get_preinitialized_window", name);
@@ -127,6 +151,8 @@ CALL(Evas_Object*, uxt_button_add, Evas_Object* parent, const char* style) {
 
 CALL(void, elm_language_set, const char* language) {
     note("elm_language_set", orNull(language));
+    if (lookWhenTheLanguageIsSet)
+        lookWhenTheLanguageIsSet();
     __real_elm_language_set(language);
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <set>
 #include <string>
 #include <vector>
@@ -14,6 +15,8 @@ const std::vector<std::string>& made();
 std::vector<std::string> madeOf(const std::vector<std::string>& names);
 void forget();
 
+/// Calls `look` whenever elm_language_set() is called, before that goes through.
+void whenTheLanguageIsSet(std::function<void()> look);
 /// Lets every call of that name fail: it gives nothing.
 void fail(const std::string& name);
 /// Whether the window manager takes rotations; in memory it does not.
