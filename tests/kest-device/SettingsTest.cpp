@@ -80,6 +80,32 @@ TEST_F(Settings, AnyVconfKeyTakesAnyValue) {
     EXPECT_EQ(run({"get", "db/example/key"}), failed("db/example/key is not set"));
 }
 
+TEST_F(Settings, ThatAreUnsetAreAsOnAFreshDevice) {
+    const nlohmann::json fresh = device_.json({"status"});
+    device_.must({"set", "language", "ko_KR"});
+    device_.must({"set", "theme", "dark"});
+    device_.must({"set", "screen", "480x800"});
+    ASSERT_NE(device_.json({"status"}), fresh);
+
+    for (const char* name : {"language", "theme", "screen"}) {
+        device_.must({"unset", name});
+    }
+
+    EXPECT_EQ(device_.json({"status"}), fresh);
+    EXPECT_EQ(run({"status"}), done("folder    " + root() +
+                                    "\nbus       none\nrunning   nothing\nlanguage  en_US\ncountry   none\n"
+                                    "theme     light\nscreen    720x1280\n"));
+}
+
+TEST_F(Settings, OfAScreenOrAThemeThatDoesNotExistAreToldAsTheDeviceTakesThem) {
+    device_.must({"set", device::keys::screen, "1x1"});
+    device_.must({"set", device::keys::theme, "pink"});
+
+    const nlohmann::json status = device_.json({"status"});
+    EXPECT_EQ(status["screen"], "720x1280");
+    EXPECT_EQ(status["theme"], "light");
+}
+
 TEST_F(Settings, AMistypedNameIsNotTakenForAKey) {
     EXPECT_EQ(run({"set", "langauge", "ko_KR"}),
               failed("there is no setting \"langauge\"; there are language, country, theme, screen, and vconf keys "

@@ -174,7 +174,7 @@ void Runtime::useLanguage() const {
 }
 
 void Runtime::useTheme() const {
-    uxt::applyDeviceTheme(device_->settings().get(device::keys::theme).value_or(device::keys::defaultTheme) == "dark");
+    uxt::applyDeviceTheme(device_->isDark());
 }
 
 void Runtime::end() {

@@ -67,6 +67,10 @@ std::string Device::language() const {
     return language.erase(codeset, std::min(language.find('@', codeset), language.size()) - codeset);
 }
 
+bool Device::isDark() const {
+    return settings_.get(keys::theme).value_or(keys::defaultTheme) == "dark";
+}
+
 std::vector<std::string> Device::languages() const {
     std::vector<std::string> languages;
     std::error_code error;

@@ -23,6 +23,14 @@ constexpr char uninstallAbout[] =
 Example:
   kest-device uninstall com.example.game)";
 
+constexpr char packagesAbout[] =
+    R"(One package a line: its id, its version, whether it is preinstalled on every device or installed on this one,
+and its name. --json tells its icon and its folder too.
+
+Examples:
+  kest-device packages
+  kest-device packages --json)";
+
 std::string nameOf(const device::Package& package) {
     return package.id + (package.version.empty() ? "" : " " + package.version);
 }
@@ -90,6 +98,7 @@ void addPackages(CLI::App& app, Session& session) {
     CLI::App* command = app.add_subcommand("packages", "List the device's packages");
     const auto json = std::make_shared<bool>(false);
     addJsonOption(*command, *json);
+    command->footer(packagesAbout);
     command->callback([json, &session] { list(session, *json); });
 }
 

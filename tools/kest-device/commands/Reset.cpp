@@ -14,7 +14,10 @@ namespace fs = std::filesystem;
 
 constexpr char about[] =
     R"(Removes the device's database, log and installed packages, and makes a fresh device in the same folder.
-Other files in the folder, also a damaged database that was set aside, stay. Refuses while an application runs.)";
+Other files in the folder, also a damaged database that was set aside, stay. Refuses while an application runs.
+
+Example:
+  kest-device stop && kest-device reset)";
 
 void requireNothingRuns(Session& session) {
     for (const RunningApplication& application : runningApplications(session)) {

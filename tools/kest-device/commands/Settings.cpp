@@ -41,6 +41,7 @@ Examples:
   kest-device set db/setting/theme dark)";
 
 constexpr char unsetExamples[] = R"(KEY is language, country, theme or screen, or a vconf key, which holds a '/'.
+The device goes on with what a fresh one has, which 'kest-device status' tells.
 Without a country, preferences are cleared as by 'kest-device set country'.
 
 Example:

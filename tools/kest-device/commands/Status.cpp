@@ -2,35 +2,43 @@
 #include "Commands.h"
 #include "Output.h"
 #include "PrivateBus.h"
-#include "Settings.h"
-
-#include <cstdlib>
+#include "device/Keys.h"
 
 namespace tool {
 
 namespace {
 
+constexpr char about[] =
+    R"(The settings are those that the device uses: what was never set, or was unset, is as on a fresh device.
+An application that is said not to answer runs without being on the device's bus; 'kest-device stop' ends it.
+
+Examples:
+  kest-device status
+  kest-device status --json)";
+
 struct State {
     std::string folder;
     std::string bus;
     std::vector<RunningApplication> running;
-    std::map<std::string, std::string> settings;
+    std::string language;
+    std::string country;
+    std::string theme;
+    std::string screen;
 };
 
 State stateOf(Session& session) {
     State state;
     state.folder = session.folder().root();
-    state.settings = readSettings(session.device());
+    device::Device& device = session.device();
+    state.language = device.language();
+    state.country = device.settings().get(device::keys::country).value_or("");
+    state.theme = device.isDark() ? "dark" : "light";
+    state.screen = device.screen().name;
     if (session.bus()) {
         state.bus = PrivateBus(session.folder()).process() ? "private" : "session";
     }
     state.running = runningApplications(session);
     return state;
-}
-
-std::string settingOr(const State& state, const std::string& name, const std::string& otherwise) {
-    const auto setting = state.settings.find(name);
-    return setting == state.settings.end() ? otherwise : setting->second;
 }
 
 void printForPeople(const State& state) {
@@ -43,9 +51,10 @@ void printForPeople(const State& state) {
     if (state.running.empty()) {
         rows.push_back({"running", "nothing"});
     }
-    for (const char* name : {"language", "country", "theme", "screen"}) {
-        rows.push_back({name, settingOr(state, name, "none")});
-    }
+    rows.push_back({"language", state.language});
+    rows.push_back({"country", state.country.empty() ? "none" : state.country});
+    rows.push_back({"theme", state.theme});
+    rows.push_back({"screen", state.screen});
     printTable(rows);
 }
 
@@ -57,10 +66,10 @@ void printAsJson(const State& state) {
         json["applications"].push_back(
             {{"id", application.id}, {"process", application.process.id()}, {"answers", application.onBus}});
     }
-    for (const char* name : {"language", "country", "theme", "screen"}) {
-        const std::string value = settingOr(state, name, "");
-        json[name] = value.empty() ? Json() : Json(value);
-    }
+    json["language"] = state.language;
+    json["country"] = state.country.empty() ? Json() : Json(state.country);
+    json["theme"] = state.theme;
+    json["screen"] = state.screen;
     print(json);
 }
 
@@ -70,6 +79,7 @@ void addStatus(CLI::App& app, Session& session) {
     CLI::App* command = app.add_subcommand("status", "Tell what the device is and what runs on it");
     const auto json = std::make_shared<bool>(false);
     addJsonOption(*command, *json);
+    command->footer(about);
     command->callback([json, &session] {
         const State state = stateOf(session);
         *json ? printAsJson(state) : printForPeople(state);

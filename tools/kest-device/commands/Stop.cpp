@@ -16,7 +16,10 @@ constexpr auto patience = 5s;
 
 constexpr char about[] =
     R"(Asks every running application of the device to end, and ends by force what does not within 5 seconds.
-Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.)";
+Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
+
+Example:
+  kest-device stop)";
 
 void endApplication(Session& session, const RunningApplication& application) {
     const std::string name = application.id + " (process " + std::to_string(application.process.id()) + ")";

@@ -5,6 +5,15 @@ namespace tool {
 
 namespace {
 
+constexpr char about[] =
+    R"(One record a line, the oldest first: its number, its time, the URI that it was written to, and its values.
+They stay until 'kest-device reset'.
+
+Examples:
+  kest-device usage
+  kest-device usage --json
+  kest-device wait-for usage=KT01)";
+
 void list(device::Device& device, bool json) {
     Json all = Json::array();
     std::vector<std::vector<std::string>> rows;
@@ -27,6 +36,7 @@ void addUsage(CLI::App& app, Session& session) {
     CLI::App* command = app.add_subcommand("usage", "List the usage records that applications have written");
     const auto json = std::make_shared<bool>(false);
     addJsonOption(*command, *json);
+    command->footer(about);
     command->callback([json, &session] { list(session.device(), *json); });
 }
 

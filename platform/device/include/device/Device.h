@@ -58,6 +58,8 @@ public:
     const Screen& screen() const;
     /// The display language without its codeset ("ko_KR").
     std::string language() const;
+    /// Whether the device's theme is the dark one; else it is the light one.
+    bool isDark() const;
     /// The languages that the device's own texts exist in, in alphabetical order ("en_US", ...).
     std::vector<std::string> languages() const;
 
