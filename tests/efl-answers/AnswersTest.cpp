@@ -84,6 +84,72 @@ TEST_F(EflAnswersForPops, APopAtRestIsCarriedOutAtOnce) {
     EXPECT_EQ(1u, items());
 }
 
+/// Items that do not want to go yet.
+class EflAnswersForVetoes : public EflAnswersForPops {
+protected:
+    EflAnswersForVetoes() {
+        elm_naviframe_item_pop_cb_set(second_, asked, this);
+        test_ui::runFor(1);
+    }
+
+    static Eina_Bool asked(void* self, Elm_Object_Item*) {
+        ++static_cast<EflAnswersForVetoes*>(self)->asked_;
+        return static_cast<EflAnswersForVetoes*>(self)->allows_;
+    }
+
+    int asked_ = 0;
+    bool allows_ = false;
+};
+
+TEST_F(EflAnswersForVetoes, AnItemThatKeptItselfWhileAnotherMovesOutIsNotAskedAgain) {
+    push();
+    test_ui::runFor(1);
+    elm_naviframe_item_pop(naviframe_);
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(1, asked_);
+    allows_ = true;
+    test_ui::runFor(1);
+    EXPECT_EQ(1, asked_);
+    EXPECT_EQ(second_, elm_naviframe_top_item_get(naviframe_));
+}
+
+TEST_F(EflAnswersForVetoes, AnItemThatKeptItselfAtRestIsNotAskedByALaterTransition) {
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(1, asked_);
+    allows_ = true;
+    Elm_Object_Item* third = elm_naviframe_item_insert_after(naviframe_, second_, nullptr, nullptr, nullptr,
+                                                             elm_layout_add(naviframe_), nullptr);
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_NE(third, elm_naviframe_top_item_get(naviframe_));
+    test_ui::runFor(1);
+    EXPECT_EQ(1, asked_);
+    EXPECT_EQ(second_, elm_naviframe_top_item_get(naviframe_));
+}
+
+TEST_F(EflAnswersForVetoes, AnItemIsAskedWhenItHasMovedIn) {
+    Elm_Object_Item* third = push();
+    elm_naviframe_item_pop_cb_set(third, asked, this);
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(0, asked_);
+    test_ui::runFor(1);
+    EXPECT_EQ(1, asked_);
+    EXPECT_EQ(third, elm_naviframe_top_item_get(naviframe_));
+}
+
+TEST_F(EflAnswersForVetoes, AnItemWhoseCallbackWasTakenAwayGoes) {
+    elm_naviframe_item_pop_cb_set(second_, nullptr, nullptr);
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(1u, items());
+    EXPECT_EQ(0, asked_);
+}
+
+TEST_F(EflAnswersForVetoes, AnItemThatKeptItselfGoesWhenItIsAskedAgain) {
+    elm_naviframe_item_pop(naviframe_);
+    allows_ = true;
+    elm_naviframe_item_pop(naviframe_);
+    EXPECT_EQ(1u, items());
+}
+
 TEST_F(EflAnswers, TheScreenIsTheDevicesWhateverShowsIt) {
     EXPECT_EQ((Rect{0, 0, 720, 1280}), screenSize());
     device_->settings().set(device::keys::screen, "480x800");
