@@ -1,12 +1,13 @@
 #pragma once
 
 #include "KestContentInfo.h"
+#include "KestLoadWork.h"
+#include "KestMarkup.h"
+#include "KestSharedResources.h"
 #include "KestStringTable.h"
-#include "KestTextTags.h"
 
 #include <libxml/tree.h>
 
-#include <map>
 #include <string>
 #include <vector>
 
@@ -33,15 +34,23 @@ private:
     KestContentMgr();
 
     // The main menu file and the detail files.
-    /// The folder of an application's shared resources, asked once a load.
-    const std::string& __sharedResources(const std::string& appid);
     std::string __detailPath(const KestContentInfo& record);
     bool __loadMainMenu();
     static KestContentInfo __readMenu(const xmlNode* menu);
     bool __loadDetailMenu(KestContentInfo& record);
     void __readDetail(xmlNode* node, KestContentInfo& record);
+    /// Puts `fragment` in the place of the first `placeholder` in the contents.
+    void __attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment);
     /// `cleaned` is the element's text without what old contents have too much.
     void __setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned);
+    static std::string __replaceString(const std::string& text, const std::string& from, const std::string& to,
+                                       bool firstOnly) {
+        return KestMarkup::replaceString(text, from, to, firstOnly);
+    }
+    static std::string __extractString(const std::string& text, const std::string& start, const std::string& end,
+                                       bool inclusive) {
+        return KestMarkup::extractString(text, start, end, inclusive);
+    }
     std::string __convertHrefPath(const std::string& appid, const std::string& text);
 
     // String resources and translation.
@@ -62,13 +71,13 @@ private:
     void __getFromPreference(const std::string& path, KestContentInfo& record);
 
     std::vector<KestContentInfo> contentsList;
-    /// Of the detail file that is being read.
-    KestTextWork textWork;
+    /// Of the load that goes on.
+    KestLoadWork work;
     /// Kept over loads.
     KestStringTable stringTable;
     /// The display language as vconf gives it, and whether it gives one; asked once a load.
     std::string displayLanguage;
     bool hasDisplayLanguage;
-    /// The shared resources of the applications that this load has met, by their ids.
-    std::map<std::string, std::string> sharedResources;
+    /// As this load has met them.
+    KestSharedResources sharedResources;
 };

@@ -7,19 +7,19 @@
 class KestPlatformString {
 public:
     KestPlatformString() = default;
-    explicit KestPlatformString(char* text) : text_(text) {}
-    ~KestPlatformString() { std::free(text_); }
+    explicit KestPlatformString(char* string) : text(string) {}
+    ~KestPlatformString() { std::free(text); }
     KestPlatformString(const KestPlatformString&) = delete;
     KestPlatformString& operator=(const KestPlatformString&) = delete;
 
     /// Where a platform call puts the string; to be used once.
-    char** out() { return &text_; }
+    char** out() { return &text; }
     /// Null when the platform gave none.
-    const char* get() const { return text_; }
-    explicit operator bool() const { return text_ != nullptr; }
+    const char* get() const { return text; }
+    explicit operator bool() const { return text != nullptr; }
     /// A copy; empty when the platform gave none.
-    std::string str() const { return text_ ? text_ : ""; }
+    std::string str() const { return text ? text : ""; }
 
 private:
-    char* text_ = nullptr;
+    char* text = nullptr;
 };

@@ -3,7 +3,8 @@
 #include <string>
 
 /// gettext domains whose names come from the catalogue. For gettext such a name is a file's, which it keeps on the
-/// stack: one with a slash, or longer than a file's name can be, is no domain and has no texts. Static; holds no state.
+/// stack: one with a slash, or longer than a file's name can be, is no domain and has no texts. Nor has one that comes
+/// after 2,048 others. Static.
 class KestTextDomain {
 public:
     /// Whether the domain translates `id` into something else.

@@ -4,18 +4,16 @@
 #include "KestContentCache.h"
 #include "KestLog.h"
 #include "KestMarkup.h"
+#include "KestPackageInfo.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
 #include "KestTextDomain.h"
 #include "KestTextTags.h"
-#include "KestXml.h"
+#include "KestXmlDocument.h"
 
 #include <libintl.h>
-#include <package_manager.h>
 #include <unistd.h>
 #include <vconf.h>
-
-#include <utility>
 
 namespace {
 
@@ -24,18 +22,11 @@ const char languageKey[] = "db/menu_widget/language";
 const char ownDomain[] = "kest";
 const char systemDomain[] = "sys_string";
 
-/// The log's words for a file that could not be used; null when it could.
-const char* failureOf(KestXmlDocument::Result result) {
-    switch (result) {
-    case KestXmlDocument::Result::NotRead:
-        return "Failed to xmlReadFile";
-    case KestXmlDocument::Result::Empty:
-        return "Empty document";
-    case KestXmlDocument::Result::Ok:
-        break;
-    }
-    return nullptr;
-}
+/// More menus than anybody scrolls through; only files that go wrong have them.
+const size_t mostMenus = 20000;
+
+/// Text is moved so much faster than it is looked up.
+const size_t passesToMove = 16;
 
 }  // namespace
 
@@ -56,7 +47,8 @@ KestContentMgr::~KestContentMgr() {
 bool KestContentMgr::loadContentsList(bool force) {
     KEST_BEGIN();
     contentsList.clear();
-    sharedResources.clear();
+    sharedResources.forget();
+    work = KestLoadWork();
     if (!__loadMainMenu()) {
         KEST_INFO("__loadMainMenu failed");
         return false;
@@ -91,18 +83,19 @@ bool KestContentMgr::loadContentsList(bool force) {
 
 bool KestContentMgr::__loadMainMenu() {
     KEST_BEGIN();
-    const std::string path = __sharedResources(KEST_APP_ID) + menuFile;
+    const std::string path = sharedResources.of(KEST_APP_ID) + menuFile;
     const int accessible = access(path.c_str(), F_OK);
     if (accessible != 0) {
         KEST_ERR("Failed to access: %d, %s", accessible, path.c_str());
         return false;
     }
     KestXmlDocument document;
-    if (const char* failure = failureOf(document.read(path))) {
-        KEST_ERR("%s", failure);
+    if (!document.read(path, work)) {
+        KEST_ERR("%s", document.failure());
         return false;
     }
     const xmlNode* menus = document.findSection("menus");
+    size_t offered = 0;
     for (xmlNode* menu = menus ? menus->children : nullptr; menu; menu = menu->next) {
         if (!KestXmlDocument::isElement(menu, "menu")) {
             continue;
@@ -110,6 +103,10 @@ bool KestContentMgr::__loadMainMenu() {
         const KestContentInfo record = __readMenu(menu);
         if (!record.isAvailable) {
             continue;
+        }
+        if (++offered > mostMenus) {
+            KEST_WARN("only the first %zu menus are read", mostMenus);
+            break;
         }
         if (access(__detailPath(record).c_str(), F_OK) == 0) {
             contentsList.push_back(record);
@@ -120,16 +117,8 @@ bool KestContentMgr::__loadMainMenu() {
     return true;
 }
 
-const std::string& KestContentMgr::__sharedResources(const std::string& appid) {
-    const auto known = sharedResources.find(appid);
-    if (known != sharedResources.end()) {
-        return known->second;
-    }
-    return sharedResources[appid] = KestCommon::getSharedResourcePath(appid);
-}
-
 std::string KestContentMgr::__detailPath(const KestContentInfo& record) {
-    return __sharedResources(record.appid) + record.path;
+    return sharedResources.of(record.appid) + record.path;
 }
 
 KestContentInfo KestContentMgr::__readMenu(const xmlNode* menu) {
@@ -157,11 +146,11 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
         return false;
     }
     KestXmlDocument document;
-    if (const char* failure = failureOf(document.read(path))) {
-        KEST_ERR("%s", failure);
+    if (!document.read(path, work)) {
+        KEST_ERR("%s", document.failure());
         return false;
     }
-    textWork = KestTextWork();
+    work.beginDetail();
     record.menuTitle = "No Title";
     record.textContents = "No Contents";
     record.iconPath = __getIconPath(record.appid);
@@ -203,7 +192,7 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
         std::string id;
         record.appName = __translateById(node, record.textdomain, text, id);
     } else if (KestXmlDocument::isElement(node, "image")) {
-        record.imagePath = __sharedResources(record.appid) + text;
+        record.imagePath = sharedResources.of(record.appid) + text;
     } else if (KestXmlDocument::isElement(node, "launchappid")) {
         record.launchAppid = text;
     } else if (KestXmlDocument::isElement(node, "launchparamkey")) {
@@ -212,20 +201,27 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
         record.launchParamValue = text;
     } else if (KestXmlDocument::isElement(node, "attach")) {
         const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
-        if (content && id && textWork.spend(record.textContents.size())) {
-            const std::string placeholder = KestXmlDocument::str(id);
-            const size_t found = KestMarkup::find(record.textContents, placeholder, 0);
-            if (found != std::string::npos) {
-                record.textContents.replace(found, placeholder.size(), __convertHrefPath(record.appid, text));
-            }
+        if (content && id) {
+            __attach(record, KestXmlDocument::str(id), __convertHrefPath(record.appid, text));
         }
+    }
+}
+
+void KestContentMgr::__attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment) {
+    if (!work.spendOnText(record.textContents.size() / passesToMove)) {
+        KEST_WARN("too much to attach: %s", record.path.c_str());
+        return;
+    }
+    const size_t found = KestMarkup::find(record.textContents, placeholder, 0);
+    if (found != std::string::npos) {
+        record.textContents.replace(found, placeholder.size(), fragment);
     }
 }
 
 std::string KestContentMgr::__translateById(xmlNode* node, const std::string& domain, const std::string& text,
                                             std::string& usedId) {
     const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
-    if (!id || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
+    if (!id || !work.spendOnText(0) || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
         return text;
     }
     usedId = KestXmlDocument::str(id);
@@ -234,32 +230,31 @@ std::string KestContentMgr::__translateById(xmlNode* node, const std::string& do
 
 void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
     const std::string translated = __translateContents(record.textdomain, cleaned);
-    std::string converted = __convertHrefPath(record.appid, translated);
-    record.textContents = converted.empty() ? text : std::move(converted);
+    record.textContents = __convertHrefPath(record.appid, translated);
+    if (record.textContents.empty()) {
+        record.textContents = text;
+    }
 }
 
 std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
     // The directory begins with a slash itself; the text engine expects both.
-    return KestMarkup::replaceString(text, "href=file:", "href=file:/" + __sharedResources(appid), false);
+    return __replaceString(text, "href=file:", "href=file:/" + sharedResources.of(appid), false);
 }
 
 void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
     KEST_BEGIN();
-    const std::string path = KestMarkup::replaceString(__detailPath(record), ".xml", "-string.xml", true);
+    const std::string path = __replaceString(__detailPath(record), ".xml", "-string.xml", true);
     if (access(path.c_str(), F_OK) != 0) {
         return;
     }
     KEST_INFO("%s use self string resource", record.appid.c_str());
     KestXmlDocument document;
-    if (const char* failure = failureOf(document.read(path))) {
-        KEST_ERR("%s", failure);
+    if (!document.read(path, work)) {
+        KEST_ERR("%s", document.failure());
         return;
     }
-    const xmlNode* items = document.findSection("items");
-    for (const xmlNode* item = items ? items->children : nullptr; item; item = item->next) {
-        if (KestXmlDocument::isElement(item, "item")) {
-            stringTable.add(item);
-        }
+    if (const xmlNode* items = document.findSection("items")) {
+        stringTable.addAll(items);
     }
 }
 
@@ -296,12 +291,12 @@ std::string KestContentMgr::__getString(const std::string& id, const std::string
 }
 
 std::string KestContentMgr::__translateContents(const std::string& domain, const std::string& contents) {
-    KestTextTags tags(contents, textWork);
+    KestTextTags tags(contents, work);
     for (std::string tag = tags.first(); !tag.empty(); tag = tags.first()) {
-        const std::string id = KestMarkup::extractString(tag, "id=\"", "\">", false);
+        const std::string id = __extractString(tag, "id=\"", "\">", false);
         if (id.empty()) {
             KEST_INFO("xml contents error: text id string part");
-            return KestMarkup::extractString(tag, ">", "<", false);
+            return __extractString(tag, ">", "<", false);
         }
         const std::string value = __getString(id, domain);
         // Markup only makes it longer.
@@ -310,7 +305,7 @@ std::string KestContentMgr::__translateContents(const std::string& domain, const
             break;
         }
     }
-    return tags.contents();
+    return tags.result();
 }
 
 bool KestContentMgr::__checkCacheAvailable() {
@@ -332,14 +327,13 @@ bool KestContentMgr::__checkCacheAvailable() {
 }
 
 std::string KestContentMgr::__getPackageVersion() {
-    package_info_h info = nullptr;
-    if (package_manager_get_package_info(KEST_APP_ID, &info) != PACKAGE_MANAGER_ERROR_NONE) {
+    const KestPackageInfo package(package_manager_get_package_info, KEST_APP_ID);
+    if (package.result() != PACKAGE_MANAGER_ERROR_NONE) {
         KEST_WARN("package_manager_get_package_info error");
         return "";
     }
     KestPlatformString version;
-    package_info_get_version(info, version.out());
-    package_info_destroy(info);
+    package_info_get_version(package.handle(), version.out());
     return version.str();
 }
 
@@ -347,21 +341,17 @@ std::string KestContentMgr::__getIconPath(const std::string& appid) {
     if (appid.empty()) {
         return "";
     }
-    package_info_h info = nullptr;
-    int result = package_info_create(appid.c_str(), &info);
-    if (result != PACKAGE_MANAGER_ERROR_NONE) {
-        KEST_ERR("package_info_create return [%d]", result);
-        package_info_destroy(info);
+    const KestPackageInfo package(package_info_create, appid);
+    if (package.result() != PACKAGE_MANAGER_ERROR_NONE) {
+        KEST_ERR("package_info_create return [%d]", package.result());
         return "No icon Path";
     }
     KestPlatformString icon;
-    result = package_info_get_icon(info, icon.out());
+    const int result = package_info_get_icon(package.handle(), icon.out());
     if (result != PACKAGE_MANAGER_ERROR_NONE || !icon) {
         KEST_ERR("pkgmgrinfo_appinfo_get_icon return [%d]", result);
-        package_info_destroy(info);
         return "No icon Path";
     }
-    package_info_destroy(info);
     return icon.str();
 }
 

@@ -1,8 +1,16 @@
 #include "KestStringTable.h"
 
-#include "KestXml.h"
+#include "KestXmlDocument.h"
 
-void KestStringTable::add(const xmlNode* item) {
+void KestStringTable::addAll(const xmlNode* items) {
+    for (const xmlNode* item = items->children; item; item = item->next) {
+        if (KestXmlDocument::isElement(item, "item")) {
+            __add(item);
+        }
+    }
+}
+
+void KestStringTable::__add(const xmlNode* item) {
     std::string region;
     std::string stringId;
     std::string value;
@@ -16,7 +24,7 @@ void KestStringTable::add(const xmlNode* item) {
         }
     }
     if (!stringId.empty()) {
-        values_[region + "_" + stringId] = value;
+        values[region + "_" + stringId] = value;
     }
 }
 
@@ -24,8 +32,8 @@ const std::string* KestStringTable::find(const std::string& language, const std:
     const size_t countryLength = 5;
     const size_t languageLength = 2;
     for (const size_t length : {countryLength, languageLength}) {
-        const auto entry = values_.find(language.substr(0, length) + "_" + id);
-        if (entry != values_.end()) {
+        const auto entry = values.find(language.substr(0, length) + "_" + id);
+        if (entry != values.end()) {
             return &entry->second;
         }
     }

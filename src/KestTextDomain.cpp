@@ -2,12 +2,21 @@
 
 #include <libintl.h>
 
+#include <set>
+
 namespace {
 
 const size_t longestName = 200;
 
+/// gettext keeps every domain that it was ever asked for, in a list.
+const size_t mostDomains = 2048;
+
 bool isDomain(const std::string& domain) {
-    return domain.size() <= longestName && domain.find('/') == std::string::npos;
+    static std::set<std::string> known;
+    if (domain.size() > longestName || domain.find('/') != std::string::npos) {
+        return false;
+    }
+    return known.count(domain) != 0 || (known.size() < mostDomains && known.insert(domain).second);
 }
 
 }  // namespace

@@ -9,69 +9,65 @@ namespace {
 const char tagBegin[] = "<text";
 const char tagEnd[] = "</text>";
 
+/// A tag and its value are searched, looked up and copied several times, the contents only moved.
+const size_t passesOverText = 8;
+const size_t passesToMove = 16;
+
 }  // namespace
 
 const size_t KestTextTags::longestContents;
+const int KestTextTags::mostReplacements;
 
-bool KestTextWork::spend(size_t bytes) {
-    if (bytes > bytes_) {
-        return false;
-    }
-    bytes_ -= bytes;
-    return true;
-}
-
-bool KestTextWork::spendReplacement() {
-    if (replacements_ == 0) {
-        return false;
-    }
-    --replacements_;
-    return true;
-}
-
-KestTextTags::KestTextTags(std::string contents, KestTextWork& work)
-    : contents_(std::move(contents)), begin_(0), work_(work) {}
+KestTextTags::KestTextTags(std::string text, KestLoadWork& workOfLoad)
+    : contents(std::move(text)), begin(0), replacements(0), work(workOfLoad) {}
 
 std::string KestTextTags::first() {
-    if (begin_ == std::string::npos) {
+    if (begin == std::string::npos) {
         return "";
     }
     // A value may have completed a beginning that stood in front of it.
     const size_t overlap = sizeof(tagBegin) - 2;
-    begin_ = KestMarkup::find(contents_, tagBegin, begin_ > overlap ? begin_ - overlap : 0);
-    const size_t end = begin_ == std::string::npos ? begin_ : KestMarkup::find(contents_, tagEnd, begin_);
-    tag_ = end == std::string::npos ? "" : contents_.substr(begin_, end + sizeof(tagEnd) - 1 - begin_);
-    return tag_;
+    begin = KestMarkup::find(contents, tagBegin, begin > overlap ? begin - overlap : 0);
+    const size_t end = begin == std::string::npos ? begin : KestMarkup::find(contents, tagEnd, begin);
+    tag = end == std::string::npos ? "" : contents.substr(begin, end + sizeof(tagEnd) - 1 - begin);
+    return tag;
 }
 
-size_t KestTextTags::countOccurrences() const {
+size_t KestTextTags::__countOccurrences() const {
     size_t count = 0;
-    for (size_t at = begin_; at != std::string::npos; at = KestMarkup::find(contents_, tag_, at + tag_.size())) {
+    for (size_t at = begin; at != std::string::npos; at = KestMarkup::find(contents, tag, at + tag.size())) {
         ++count;
     }
     return count;
 }
 
 bool KestTextTags::replaceFirst(const std::string& value) {
-    const size_t count = countOccurrences();
-    if (count == 0) {
+    const size_t count = __countOccurrences();
+    if (count == 0 || replacements == mostReplacements) {
         return false;
     }
-    const size_t kept = contents_.size() - count * tag_.size();
-    const bool tooLong = contents_.size() > longestContents || value.size() > (longestContents - kept) / count;
-    if (tooLong || !work_.spend(count * value.size()) || !work_.spendReplacement()) {
+    const size_t kept = contents.size() - count * tag.size();
+    if (contents.size() > longestContents || value.size() > (longestContents - kept) / count) {
         return false;
     }
+    if (!work.spendOnText(passesOverText * (tag.size() + count * value.size()) + contents.size() / passesToMove)) {
+        return false;
+    }
+    ++replacements;
     if (count == 1) {
-        contents_.replace(begin_, tag_.size(), value);
-        return true;
+        contents.replace(begin, tag.size(), value);
+    } else {
+        __replaceAll(value);
     }
-    std::string replaced(contents_, 0, begin_);
-    size_t copied = begin_;
-    for (size_t at = begin_; at != std::string::npos; at = KestMarkup::find(contents_, tag_, copied)) {
-        replaced.append(contents_, copied, at - copied).append(value);
-        copied = at + tag_.size();
-    }
-    contents_ = replaced.append(contents_, copied, std::string::npos);
     return true;
+}
+
+void KestTextTags::__replaceAll(const std::string& value) {
+    std::string replaced(contents, 0, begin);
+    size_t copied = begin;
+    for (size_t at = begin; at != std::string::npos; at = KestMarkup::find(contents, tag, copied)) {
+        replaced.append(contents, copied, at - copied).append(value);
+        copied = at + tag.size();
+    }
+    contents = replaced.append(contents, copied, std::string::npos);
 }

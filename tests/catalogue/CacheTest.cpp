@@ -302,3 +302,12 @@ TEST_F(Cache, FollowsTheRegionOfTheMainMenuFile) {
     EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("B"));
     EXPECT_FALSE(loadedFromFiles());
 }
+
+TEST_F(Cache, OfNoLanguageIsInvalidWhereTheDeviceNamesNone) {
+    fill();
+    setPreference("KestCurrentLanguage", "");
+    device()->settings().remove(device::keys::language);
+    loadAtNextStart();
+    EXPECT_TRUE(loadedFromFiles());
+    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
+}

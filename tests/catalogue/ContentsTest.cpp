@@ -177,3 +177,11 @@ TEST_F(Contents, AreCachedWithTheirAttachments) {
     loadTip(contents("before ICON") + attach("ICON", "x"));
     EXPECT_EQ(preference("contents_tip.xml_textContents"), "before x");
 }
+
+TEST_F(Contents, OfTheOldStyleLoseTheirTitleOnlyBehindTheItem) {
+    EXPECT_EQ(loadContents("<item><text a></text></item>one<br/>two"), "one<br/>two");
+}
+
+TEST_F(Contents, OfTheOldStyleLoseLineBreaksThatTheOthersLeave) {
+    EXPECT_EQ(loadContents("<item></item><text a></text>one<b<br/>r>two"), "onetwo");
+}

@@ -1,10 +1,43 @@
 #include "CatalogueTest.h"
 
 #include <package_info.h>
+#include <package_manager.h>
+
+#include <set>
 
 using namespace manager_log;
 using testing::ElementsAre;
 using testing::IsEmpty;
+
+extern "C" {
+int __real_package_info_create(const char* package, package_info_h* info);
+int __wrap_package_info_create(const char* package, package_info_h* info);
+int __real_package_manager_get_package_info(const char* package, package_info_h* info);
+int __wrap_package_manager_get_package_info(const char* package, package_info_h* info);
+int __real_package_info_destroy(package_info_h info);
+int __wrap_package_info_destroy(package_info_h info);
+}
+
+static std::multiset<package_info_h> held;
+
+static int keep(int result, const package_info_h* info) {
+    if (result == PACKAGE_MANAGER_ERROR_NONE)
+        held.insert(*info);
+    return result;
+}
+
+int __wrap_package_info_create(const char* package, package_info_h* info) {
+    return keep(__real_package_info_create(package, info), info);
+}
+
+int __wrap_package_manager_get_package_info(const char* package, package_info_h* info) {
+    return keep(__real_package_manager_get_package_info(package, info), info);
+}
+
+int __wrap_package_info_destroy(package_info_h info) {
+    held.erase(info);
+    return __real_package_info_destroy(info);
+}
 
 class Icon : public CatalogueTest {
 protected:
@@ -66,4 +99,13 @@ TEST_F(Icon, IsATextWhenThePackageDoesNotTellIt) {
     device::faults::plan("package_info_get_icon", -5, 100);
     EXPECT_EQ(iconOf("com.example.clock"), "No icon Path");
     EXPECT_THAT(errors(), ElementsAre(error("__getIconPath", "pkgmgrinfo_appinfo_get_icon return [-5]")));
+}
+
+TEST_F(Icon, IsCopiedFromAHandleThatIsDestroyed) {
+    addApplication("com.example.clock");
+    EXPECT_NE(iconOf("com.example.clock"), "");
+    EXPECT_THAT(held, IsEmpty());
+    device::faults::plan("package_info_get_icon", -5, 1);
+    EXPECT_EQ(iconOf("com.example.clock"), "No icon Path");
+    EXPECT_THAT(held, IsEmpty());
 }

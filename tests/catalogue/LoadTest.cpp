@@ -27,6 +27,14 @@ TEST_F(FirstLoad, HappensWhenTheManagerIsAskedFor) {
                             begin("__loadDetailMenu"), begin("__loadStringResource"), hit("__saveToPreference")));
 }
 
+TEST_F(FirstLoad, TakesAValidCache) {
+    writeTip("<title>From the file</title>");
+    setPreference("KestCurrentLanguage", "en_US.UTF-8");
+    setPreference("KestPackageVersion", "1.0.0");
+    setPreference("contents_tip.xml_menuTitle", "Cached");
+    EXPECT_THAT(titles(KestContentMgr::getInstance()->getContentsList()), ElementsAre("Cached"));
+}
+
 TEST_F(Load, LeavesATraceOfEveryStep) {
     writeTip("<title>A</title>");
     load();

@@ -41,6 +41,14 @@ TEST_F(TextTag, MayHaveOtherAttributesBeforeItsId) {
     EXPECT_EQ(loadContents("<text class=\"x\" id=\"IDS_SYSTEM\">a</text>"), "System text");
 }
 
+TEST_F(TextTag, MayBeginInATranslation) {
+    for (std::size_t length = 1; length <= sizeof("<text") - 1; ++length) {
+        writeStrings({{"en", "IDS_A", std::string("<text").substr(0, length)}});
+        const std::string rest = std::string("<text").substr(length) + " id=\"IDS_SYSTEM\">x</text>";
+        EXPECT_EQ(loadContents(textTag("IDS_A") + rest), "System text") << length;
+    }
+}
+
 TEST_F(TextTag, WithABlankAfterItsIdIsFaultyAndAllThatIsLeft) {
     EXPECT_EQ(loadContents("before <text id=\"IDS_A\" >Hi</text> after"), "Hi");
     EXPECT_TRUE(sawFaultyTag());

@@ -29,6 +29,14 @@ TEST_F(Translation, OfATitleReplacesItsTextAndKeepsItsId) {
     EXPECT_EQ(record.titleId, "IDS_OWN");
 }
 
+TEST_F(Translation, OfATitleAndANameIsTakenAsItStands) {
+    const std::string value = "A & B\nnext line\\nno line";
+    writeStrings({{"en", "IDS_MINE", value}});
+    const KestContentInfo record = loadTip("<title id=\"IDS_MINE\">x</title><appname id=\"IDS_MINE\">x</appname>");
+    EXPECT_EQ(record.menuTitle, value);
+    EXPECT_EQ(record.appName, value);
+}
+
 TEST_F(Translation, OfATitleThatNothingKnowsIsItsText) {
     const KestContentInfo record = loadTip("<title id=\"IDS_NOWHERE\">untranslated</title>");
     EXPECT_EQ(record.menuTitle, "untranslated");

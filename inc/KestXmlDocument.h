@@ -1,5 +1,7 @@
 #pragma once
 
+#include "KestLoadWork.h"
+
 #include <libxml/parser.h>
 #include <libxml/tree.h>
 
@@ -9,18 +11,15 @@
 /// One of the catalogue's XML files, parsed, and what the loaders ask of its nodes. Frees the document with itself.
 class KestXmlDocument {
 public:
-    enum class Result {
-        Ok,
-        NotRead,  ///< not a regular file, or not to be parsed at all
-        Empty     ///< no root element, or a root without children
-    };
-
     /// Parses the file, recovering from errors. Never blocks: what is not a regular file is not opened. Nor is parsed
-    /// what is compressed, larger than 16 MiB, or has thousands of attributes in one tag. References to entities that
-    /// the file declares are left out when they stand for more text than any catalogue has.
-    Result read(const std::string& path);
+    /// what KestXmlLimits does not accept or `work` has nothing left for. References to entities that the file
+    /// declares are left out when they stand for more text than any catalogue has.
+    /// False for what could not be parsed at all, and for a document without a root element or whose root has no
+    /// children; failure() says which.
+    bool read(const std::string& path, KestLoadWork& work);
+    const char* failure() const;
 
-    /// The first element of that name below the root; null when there is none. Only after read() said Ok.
+    /// The first element of that name below the root; null when there is none. Only after read() was true.
     xmlNode* findSection(const char* name) const;
 
     static bool isElement(const xmlNode* node, const char* name);
@@ -37,5 +36,5 @@ private:
     struct FreeDocument {
         void operator()(xmlDoc* document) const { xmlFreeDoc(document); }
     };
-    std::unique_ptr<xmlDoc, FreeDocument> document_;
+    std::unique_ptr<xmlDoc, FreeDocument> document;
 };

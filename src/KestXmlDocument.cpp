@@ -1,6 +1,7 @@
-#include "KestXml.h"
+#include "KestXmlDocument.h"
 
 #include "KestFiles.h"
+#include "KestXmlLimits.h"
 
 #include <map>
 
@@ -15,47 +16,59 @@ void freeText(xmlChar* text) {
     xmlFree(text);
 }
 
-/// Files that are larger take more memory, parsed, than a device has.
-const std::uintmax_t largestFile = 16 * 1024 * 1024;
+/// The text that the parser is given for the file that it opens. So it is the text that was judged, and the parser
+/// neither unpacks it nor opens another file.
+struct Source {
+    const std::string& text;
+    size_t at;
+};
+Source* source = nullptr;
 
-/// The parser compares every attribute of an element with all the others.
-const size_t mostAttributes = 4096;
-
-bool beginsWith(const std::string& text, const std::string& begin) {
-    return text.compare(0, begin.size(), begin) == 0;
+int isForParser(const char*) {
+    return source ? 1 : 0;
 }
 
-/// The parser would unpack it, to any size.
-bool isCompressed(const std::string& text) {
-    const std::string gzip("\x1f\x8b");
-    const std::string xz("\xfd"
-                         "7zXZ");
-    const std::string lzma("\x5d\0\0", 3);
-    return beginsWith(text, gzip) || beginsWith(text, xz) || beginsWith(text, lzma);
+void* openText(const char*) {
+    return source->at == 0 ? source : nullptr;
 }
 
-/// Counted roughly: what looks like attributes between two angle brackets.
-bool hasTooManyAttributes(const std::string& text) {
-    size_t count = 0;
-    char last = '\0';
-    for (const char character : text) {
-        if (character == '<' || character == '>') {
-            count = 0;
-        } else if (last == '=' && (character == '"' || character == '\'') && ++count > mostAttributes) {
-            return true;
-        }
-        last = character;
+int readText(void* context, char* buffer, int length) {
+    auto* from = static_cast<Source*>(context);
+    const size_t count = from->text.copy(buffer, static_cast<size_t>(length), from->at);
+    from->at += count;
+    return static_cast<int>(count);
+}
+
+int closeText(void*) {
+    return 0;
+}
+
+bool giveTextsToParser() {
+    // The parser asks the callbacks that were registered last first, so its own must be there already.
+    xmlInitParser();
+    return xmlRegisterInputCallbacks(isForParser, openText, readText, closeText) >= 0;
+}
+
+void dropMessage(void*, xmlErrorPtr) {}
+
+/// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
+class Parsing {
+public:
+    explicit Parsing(const std::string& text) : current{text, 0} {
+        static const bool given = giveTextsToParser();
+        source = given ? &current : nullptr;
+        xmlSetStructuredErrorFunc(nullptr, dropMessage);
     }
-    return false;
-}
-
-bool isReadable(const std::string& path) {
-    if (!KestFiles::isRegular(path) || KestFiles::size(path) > largestFile) {
-        return false;
+    ~Parsing() {
+        source = nullptr;
+        xmlSetStructuredErrorFunc(nullptr, nullptr);
     }
-    const std::string text = KestFiles::readBegin(path, largestFile);
-    return !isCompressed(text) && !hasTooManyAttributes(text);
-}
+    Parsing(const Parsing&) = delete;
+    Parsing& operator=(const Parsing&) = delete;
+
+private:
+    Source current;
+};
 
 /// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand
 /// for gigabytes, which the parser does not notice while it only refers to them.
@@ -86,18 +99,18 @@ private:
         if (!entity) {
             return 0;
         }
-        const auto known = lengths_.find(entity);
-        if (known != lengths_.end()) {
+        const auto known = lengths.find(entity);
+        if (known != lengths.end()) {
             return known->second;
         }
         // Stands until the real length is known, so that an entity that holds itself ends the search.
-        lengths_[entity] = mostReferredText + 1;
+        lengths[entity] = mostReferredText + 1;
         const size_t length = lengthOf(entity->children, true);
-        lengths_[entity] = length;
+        lengths[entity] = length;
         return length;
     }
 
-    std::map<const xmlEntity*, size_t> lengths_;
+    std::map<const xmlEntity*, size_t> lengths;
 };
 
 /// From a node and those after it.
@@ -119,21 +132,31 @@ void removeReferences(xmlNode* first) {
 
 }  // namespace
 
-KestXmlDocument::Result KestXmlDocument::read(const std::string& path) {
-    document_.reset(isReadable(path) ? xmlReadFile(path.c_str(), "utf-8", recoverFromErrors) : nullptr);
-    if (!document_) {
-        return Result::NotRead;
+bool KestXmlDocument::read(const std::string& path, KestLoadWork& work) {
+    document.reset();
+    std::string text;
+    if (KestFiles::read(path, KestXmlLimits::longestFile, text) && KestXmlLimits::accept(text) &&
+        work.spendOnFile(text.size())) {
+        const Parsing parsing(text);
+        document.reset(xmlReadFile(path.c_str(), "utf-8", recoverFromErrors));
     }
-    xmlNode* root = xmlDocGetRootElement(document_.get());
+    if (!document) {
+        return false;
+    }
+    xmlNode* root = xmlDocGetRootElement(document.get());
     // Without declarations of its own a document has no entity that stands for more than a character.
-    if (document_->intSubset && ReferredText().lengthIn(document_.get()) > mostReferredText) {
+    if (document->intSubset && ReferredText().lengthIn(document.get()) > mostReferredText) {
         removeReferences(root);
     }
-    return root && root->children ? Result::Ok : Result::Empty;
+    return root && root->children;
+}
+
+const char* KestXmlDocument::failure() const {
+    return document ? "Empty document" : "Failed to xmlReadFile";
 }
 
 xmlNode* KestXmlDocument::findSection(const char* name) const {
-    xmlNode* node = xmlDocGetRootElement(document_.get())->children;
+    xmlNode* node = xmlDocGetRootElement(document.get())->children;
     while (node && !isElement(node, name)) {
         node = node->next;
     }
