@@ -156,11 +156,13 @@ TEST_F(Tables, APipeADirectoryAndAHugeFileAreRefusedAtOnce) {
 
 TEST_F(Tables, NoFileNameAndNoSuchTableAreSaid) {
     EXPECT_EQ(nullptr, uxt_theme_add_color_table(nullptr));
+    EXPECT_EQ(nullptr, uxt_theme_add_font_table(""));
     uxt_theme_delete_color_table(nullptr);
     const uxt_color_table_h table = uxt_theme_add_color_table(file("<color_table/>").c_str());
     uxt_theme_delete_color_table(table);
     uxt_theme_delete_color_table(table);
     EXPECT_THAT(device_.logMessages(), ElementsAre("E UXT uxt_theme_add_color_table: no file is named",
+                                                   "E UXT uxt_theme_add_font_table: no file is named",
                                                    "E UXT uxt_theme_delete_color_table: there is no such table"));
 }
 

@@ -10,9 +10,15 @@ extern "C" {
  */
 char* app_get_resource_path(void);
 
-/** The id of the running application. @param[out] id to be freed with free() @return 0 or a negative error */
+/**
+ * The id of the running application.
+ * @param[out] id to be freed with free(); untouched on error
+ * @return TIZEN_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY; IO_ERROR when the device cannot be opened or
+ *         the process is no application
+ */
 int app_get_id(char** id);
 
+/** What an application may be told of; the numbers are the interface's own. The device sends LANGUAGE_CHANGED only. */
 typedef enum {
     APP_EVENT_LOW_MEMORY = 0,
     APP_EVENT_LOW_BATTERY = 1,

@@ -18,21 +18,52 @@ typedef enum {
 /** A launch request: an application id and string extras. Opaque. */
 typedef struct app_control_s* app_control_h;
 
-/** @param[out] app_control to be freed with app_control_destroy() */
+/**
+ * Makes an empty request.
+ * @param[out] app_control to be freed with app_control_destroy(); untouched on error
+ * @return APP_CONTROL_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int app_control_create(app_control_h* app_control);
+
+/** Frees a request and its extras. @return APP_CONTROL_ERROR_NONE; INVALID_PARAMETER for NULL (which does no harm) */
 int app_control_destroy(app_control_h app_control);
 
+/**
+ * Says which application is meant, in place of an earlier one.
+ * @param app_id is copied; "" takes the id away
+ * @return APP_CONTROL_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int app_control_set_app_id(app_control_h app_control, const char* app_id);
-/** @param[out] app_id to be freed with free() @return KEY_NOT_FOUND when none was set */
+
+/**
+ * Gives the id of the application that is meant.
+ * @param[out] app_id to be freed with free(); untouched on error
+ * @return APP_CONTROL_ERROR_NONE; KEY_NOT_FOUND when none was set; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int app_control_get_app_id(app_control_h app_control, char** app_id);
 
-/** Adds an extra or replaces it. Both strings are copied; neither may be NULL, the key not empty. */
+/**
+ * Adds an extra or replaces it. Both strings are copied.
+ * @return APP_CONTROL_ERROR_NONE; INVALID_PARAMETER for NULL or an empty key; OUT_OF_MEMORY
+ */
 int app_control_add_extra_data(app_control_h app_control, const char* key, const char* value);
-/** @param[out] value to be freed with free(); untouched on error @return KEY_NOT_FOUND when there is no such extra */
+
+/**
+ * Gives the value of an extra.
+ * @param[out] value to be freed with free(); untouched on error
+ * @return APP_CONTROL_ERROR_NONE; KEY_NOT_FOUND when there is no such extra; INVALID_PARAMETER for NULL or an empty
+ *         key; OUT_OF_MEMORY
+ */
 int app_control_get_extra_data(app_control_h app_control, const char* key, char** value);
 
-/** Calls `callback` for each extra in the order of their keys until it returns false. */
+/** @param key the request's own, as long as the call lasts @return whether to go on with the next extra */
 typedef bool (*app_control_extra_data_cb)(app_control_h app_control, const char* key, void* user_data);
+
+/**
+ * Calls `callback` for each extra in the order of their keys until it returns false. It may change the extras; those
+ * that were there at first are gone through.
+ * @return APP_CONTROL_ERROR_NONE, also when the callback ended it; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int app_control_foreach_extra_data(app_control_h app_control, app_control_extra_data_cb callback, void* user_data);
 
 #ifdef __cplusplus

@@ -17,7 +17,8 @@ typedef enum {
 /**
  * The directory of an application's resources that other applications may read.
  * @param[out] path absolute, ends with "/"; to be freed with free(); untouched on error
- * @return APP_MANAGER_ERROR_NONE; NO_SUCH_APP when it is not installed (an empty id too); INVALID_PARAMETER; IO_ERROR
+ * @return APP_MANAGER_ERROR_NONE; NO_SUCH_APP when it is not installed (an empty id too); INVALID_PARAMETER
+ *         for NULL; OUT_OF_MEMORY; IO_ERROR when the device cannot be read
  */
 int app_manager_get_shared_resource_path(const char* app_id, char** path);
 

@@ -16,18 +16,23 @@ typedef enum {
 
 /**
  * Stores a string in the calling application's preferences; an old value is replaced.
- * @return PREFERENCE_ERROR_NONE; INVALID_PARAMETER for a NULL argument; IO_ERROR when it could not be written
+ * @return PREFERENCE_ERROR_NONE; INVALID_PARAMETER for a NULL argument; OUT_OF_MEMORY; IO_ERROR when it could not
+ *         be written
  */
 int preference_set_string(const char* key, const char* value);
 
 /**
  * Reads a string from the calling application's preferences.
  * @param[out] value to be freed with free(); untouched on error
- * @return PREFERENCE_ERROR_NONE; NO_KEY when it was never set; INVALID_PARAMETER; IO_ERROR
+ * @return PREFERENCE_ERROR_NONE; NO_KEY when it was never set; INVALID_PARAMETER for NULL; OUT_OF_MEMORY; IO_ERROR
+ *         when the device cannot be read
  */
 int preference_get_string(const char* key, char** value);
 
-/** Removes all preferences of the calling application. @return PREFERENCE_ERROR_NONE or IO_ERROR */
+/**
+ * Removes all preferences of the calling application.
+ * @return PREFERENCE_ERROR_NONE; OUT_OF_MEMORY; IO_ERROR when they could not be removed
+ */
 int preference_remove_all(void);
 
 #ifdef __cplusplus

@@ -17,18 +17,33 @@ typedef enum {
 /** Typed values by key; here: strings. Opaque. */
 typedef struct _bundle_t bundle;
 
-/** @return to be freed with bundle_free(); NULL when memory is out */
+/** Makes an empty bundle. @return to be freed with bundle_free(); NULL when memory is out */
 bundle* bundle_create(void);
+
+/** Frees a bundle with its values. @return BUNDLE_ERROR_NONE; INVALID_PARAMETER for NULL (which does no harm) */
 int bundle_free(bundle* b);
 
-/** @return BUNDLE_ERROR_NONE; KEY_EXISTS (the value stays as it was); INVALID_PARAMETER for NULL or an empty key */
+/**
+ * Adds a string. Key and value are copied.
+ * @return BUNDLE_ERROR_NONE; KEY_EXISTS (the value stays as it was); INVALID_PARAMETER for NULL or an empty key;
+ *         OUT_OF_MEMORY
+ */
 int bundle_add_str(bundle* b, const char* key, const char* str);
 
-/** @param[out] str points into the bundle; not to be freed */
+/**
+ * Gives the string of that key.
+ * @param[out] str points into the bundle and lives as long as it; not to be freed; untouched on error
+ * @return BUNDLE_ERROR_NONE; KEY_NOT_AVAILABLE when there is none; INVALID_PARAMETER for NULL or an empty key
+ */
 int bundle_get_str(bundle* b, const char* key, char** str);
 
-/** Calls `iterator` for each string in the order of their keys. */
+/** @param key, value the bundle's own, as long as the call lasts */
 typedef void (*bundle_str_iterator_t)(const char* key, const char* value, void* user_data);
+
+/**
+ * Calls `iterator` for each string in the order of their keys; it may add to the bundle, which it is not called for.
+ * NULL for the bundle or the iterator does nothing.
+ */
 void bundle_foreach_str(bundle* b, bundle_str_iterator_t iterator, void* user_data);
 
 #ifdef __cplusplus

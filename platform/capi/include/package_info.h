@@ -20,17 +20,27 @@ typedef struct package_info_s* package_info_h;
 /**
  * Looks an installed package up.
  * @param[out] info to be freed with package_info_destroy(); set to NULL on error
- * @return PACKAGE_MANAGER_ERROR_NONE; NO_SUCH_PACKAGE; INVALID_PARAMETER; IO_ERROR (also for a broken manifest)
+ * @return PACKAGE_MANAGER_ERROR_NONE; NO_SUCH_PACKAGE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY; IO_ERROR
+ *         (also for a broken manifest)
  */
 int package_info_create(const char* package, package_info_h* info);
 
 /** Frees a handle. @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL (which does no harm) */
 int package_info_destroy(package_info_h info);
 
-/** @param[out] version possibly empty; to be freed with free() */
+/**
+ * Gives the package's version.
+ * @param[out] version possibly empty; to be freed with free(); untouched on error
+ * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int package_info_get_version(package_info_h info, char** version);
 
-/** @param[out] path absolute path of the icon, NULL when the package names none; to be freed with free() */
+/**
+ * Gives the path of the icon of the package's application.
+ * @param[out] path absolute, of a file that need not exist; NULL when the package names none; to be freed with
+ *             free(); untouched on error
+ * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
 int package_info_get_icon(package_info_h info, char** path);
 
 #ifdef __cplusplus

@@ -23,7 +23,8 @@ typedef enum {
 /**
  * Reads a string setting.
  * @param[out] value to be freed with free(); untouched on error
- * @return SYSTEM_SETTINGS_ERROR_NONE; NOT_SUPPORTED for another key; INVALID_PARAMETER for NULL; IO_ERROR
+ * @return SYSTEM_SETTINGS_ERROR_NONE; NOT_SUPPORTED for another key; INVALID_PARAMETER for NULL; OUT_OF_MEMORY;
+ *         IO_ERROR when the device cannot be read
  */
 int system_settings_get_value_string(system_settings_key_e key, char** value);
 

@@ -23,11 +23,14 @@ typedef enum {
  *         line, when it cannot be read or is no such table
  */
 uxt_color_table_h uxt_theme_add_color_table(const char* path);
-/** Reads a font table: an XML file that gives each text class its font and size. Otherwise as above. */
+/**
+ * Reads a font table: an XML file that gives each text class its font and size.
+ * @return to be freed with uxt_theme_delete_font_table(); NULL as above
+ */
 uxt_font_table_h uxt_theme_add_font_table(const char* path);
 /**
  * Frees a table; where it is in use its classes go back to what the device's theme and the theme files say. NULL does
- * nothing.
+ * nothing; a handle that is no table (any more) is an error line in the log.
  */
 void uxt_theme_delete_color_table(uxt_color_table_h table);
 void uxt_theme_delete_font_table(uxt_font_table_h table);
@@ -55,17 +58,22 @@ void uxt_theme_object_set_font_table(Evas_Object* obj, uxt_font_table_h table);
 /** Called after the device's theme changed and the colours were applied. */
 typedef void (*uxt_theme_changed_cb)(void* user_data);
 /**
+ * Has `callback` called at every change of the device's theme, once a registration. NULL is an error line in the log.
  * @param obj the object that the callback is about, or NULL (0) for the application. It only tells
  *            registrations apart.
+ * @param user_data what the callback gets; it has to live until uxt_theme_delete_changed_callback()
  */
 void uxt_theme_add_changed_callback(Evas_Object* obj, uxt_theme_changed_cb callback, void* user_data);
-/** Removes the oldest registration of this callback for this object. */
+/**
+ * Removes the oldest registration of this callback for this object; where there is none, an error line in the log.
+ */
 void uxt_theme_delete_changed_callback(Evas_Object* obj, uxt_theme_changed_cb callback);
 
 /**
  * Adds a button in a style of the device's theme. A style that the theme lacks is a warning in the log; the button then
  * has the default one.
- * @return a widget that `parent` owns; NULL when it cannot be made
+ * @param style NULL: the default one
+ * @return a widget that `parent` owns; NULL when it cannot be made, for example without a parent
  */
 Evas_Object* uxt_button_add(Evas_Object* parent, const char* style);
 

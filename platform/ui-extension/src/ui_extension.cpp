@@ -37,7 +37,7 @@ void chooseForApplication(const char* function, const std::function<void(TableCh
 template <typename Table>
 Table* addTable(const char* function, Table (*read)(const std::string&), const char* path) {
     return guarded(function, static_cast<Table*>(nullptr), [read, path]() -> Table* {
-        if (!path)
+        if (!path || !*path)
             throw std::invalid_argument("no file is named");
         try {
             return Appearance::ofProcess().add(read(path));

@@ -20,7 +20,8 @@ public:
     /// onStart, onCreate, the first onAppControl from inside the main loop, and the main loop until it ends,
     /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request.
     /// Returns the process's exit status: 0; 1 when the device cannot be opened, when there is no display, when the
-    /// bus has another device, or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on standard error.
+    /// bus has another device, or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on
+    /// standard error.
     /// An application that is running already on the same device is said too, and gives 0.
     int start(int argc, char** argv);
 
@@ -33,9 +34,11 @@ public:
     static WApp* getInstance();
 
 protected:
+    /// The device is open and EFL runs; no window is attached yet.
     virtual void onStart(int argc, char** argv);
-    /// False ends the application with status 1.
+    /// Makes the window and what there is before the first launch request; false ends the application with status 1.
     virtual bool onCreate();
+    /// The main loop has ended. Called only where onCreate() returned true.
     virtual void onTerminate();
     /// The window is out of sight (put away), or in sight again. Also around the main loop: in sight after the
     /// first launch request, out of sight before onTerminate.

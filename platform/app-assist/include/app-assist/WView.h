@@ -37,8 +37,9 @@ protected:
     virtual void onDestroy();
     /// A chance to set properties of the container (window or naviframe) that will hold the view.
     virtual void onSetContainerProperties(Evas_Object* container);
-    /// Puts the view on the naviframe and returns the item; the base pushes it plainly.
+    /// Puts the view on the naviframe and returns the item; null when that failed. The base pushes it plainly.
     virtual Elm_Object_Item* onPushToNaviframe(Evas_Object* naviframe);
+    /// The view is on the naviframe, or a page of a page slide view; then `naviItem` is the item that holds that one.
     virtual void onPushed(Elm_Object_Item* naviItem);
     /// Called before the view is popped; false keeps it. The last view is never popped: the application ends.
     virtual bool onPop();
