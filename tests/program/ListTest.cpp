@@ -1,5 +1,8 @@
 #include "ProgramTest.h"
 
+#include <set>
+#include <sstream>
+
 using testing::Contains;
 using testing::IsEmpty;
 using testing::Not;
@@ -118,12 +121,40 @@ TEST_F(TipsList, FitsTheSmallScreen) {
     EXPECT_THAT(shown["rows"], SizeIs(menusOfferedIn("Global").size() + 1));
 }
 
+TEST_F(TipsList, ALaterStartOpensTheMainMenuAndNoOtherFileOfTheCatalogue) {
+    const auto openedAtAStart = [&](const char* name) {
+        const std::filesystem::path trace = device_.folder() / name;
+        const test_tool::Result started = device_.runTraced({"start", "--headless"}, trace);
+        device_.must({"stop"});
+        std::set<std::string> opened;
+        std::istringstream lines(support::readFile(trace));
+        const std::string folder = "/shared/res/contents/";
+        for (std::string line; std::getline(lines, line);)
+            if (const std::size_t at = line.find(folder); at != std::string::npos && line.find(".xml\"") != line.npos)
+                opened.insert(line.substr(at + folder.size(), line.find('"', at) - at - folder.size()));
+        return std::pair(started.status, opened);
+    };
+    const auto [first, openedFirst] = openedAtAStart("first");
+    if (first != 0)
+        GTEST_SKIP() << "processes may not be traced here: " << support::readFile(device_.folder() / "first");
+    EXPECT_THAT(openedFirst, Contains("kest_menu.xml"));
+    // A detail file and its string file for every menu.
+    EXPECT_THAT(openedFirst, SizeIs(1 + 2 * menusOfferedIn("Global").size()));
+
+    const auto [later, openedLater] = openedAtAStart("later");
+    EXPECT_EQ(later, 0);
+    EXPECT_THAT(openedLater, testing::ElementsAre("kest_menu.xml"));
+}
+
 TEST_F(TipsList, ALaterStartUsesTheCacheUntilItIsCleared) {
     start();
     const std::vector<std::string> first = titles();
     EXPECT_THAT(logged("Language changed"), IsEmpty()) << "there was no language to compare with";
+    const std::size_t readAtFirst = logged("BEGIN").size();
     restart();
     EXPECT_EQ(titles(), first);
+    EXPECT_GT(readAtFirst, first.size() * 2);
+    EXPECT_LT(logged("BEGIN").size(), readAtFirst + first.size()) << "no tip is read again";
 
     device_.must({"stop"});
     EXPECT_NE(device_.json({"preferences", app})[app], nlohmann::json::object());

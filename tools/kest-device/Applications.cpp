@@ -82,6 +82,11 @@ void addThoseWithoutBus(Session& session, std::vector<RunningApplication>& runni
     }
 }
 
+device::Error otherDevice(const std::string& folder, const std::string& application) {
+    return device::Error("this bus already has the device " + folder + ", which runs " + application +
+                         "; end it with 'KEST_DEVICE=" + folder + " kest-device stop' first");
+}
+
 }  // namespace
 
 std::vector<RunningApplication> runningApplications(Session& session) {
@@ -103,8 +108,7 @@ void requireOwnBus(Session& session, const device::Bus& bus) {
         }
         const std::string folder = folderOf(bus, name);
         if (!folder.empty() && folder != session.folder().root()) {
-            throw device::Error("this bus already has the device " + folder + ", which runs " + name +
-                                "; end it with 'KEST_DEVICE=" + folder + " kest-device stop' first");
+            throw otherDevice(folder, name);
         }
     }
 }

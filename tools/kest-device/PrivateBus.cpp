@@ -44,7 +44,7 @@ fs::path daemonProgram() {
     std::string folders = std::string(path ? path : "") + ":/usr/bin:/bin";
     for (std::size_t begin = 0; begin < folders.size();) {
         const std::size_t end = std::min(folders.find(':', begin), folders.size());
-        const fs::path program = fs::path(folders.substr(begin, end - begin)) / "dbus-daemon";
+        fs::path program = fs::path(folders.substr(begin, end - begin)) / "dbus-daemon";
         if (program.is_absolute() && access(program.c_str(), X_OK) == 0) {
             return program;
         }

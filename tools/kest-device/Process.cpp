@@ -49,13 +49,14 @@ std::vector<std::string> environmentWith(const std::vector<std::pair<std::string
         }
     }
     for (const auto& [name, value] : changes) {
-        all.push_back(name + "=" + value);
+        all.push_back(std::string(name).append("=").append(value));
     }
     return all;
 }
 
 std::vector<char*> pointersTo(std::vector<std::string>& texts) {
     std::vector<char*> pointers;
+    pointers.reserve(texts.size() + 1);
     for (std::string& text : texts) {
         pointers.push_back(text.data());
     }

@@ -90,9 +90,14 @@ std::optional<std::string> readSetting(device::Device& device, const std::string
 
 std::map<std::string, std::string> readSettings(device::Device& device) {
     std::map<std::string, std::string> settings;
-    for (const auto& [key, value] : device.settings().all()) {
-        const auto known = std::find_if(names.begin(), names.end(), [&](const Name& name) { return name.key == key; });
-        settings[known == names.end() ? key : known->name] = known == names.end() ? value : forPeople(key, value);
+    for (const auto& setting : device.settings().all()) {
+        const auto known =
+            std::find_if(names.begin(), names.end(), [&](const Name& name) { return name.key == setting.first; });
+        if (known == names.end()) {
+            settings.insert(setting);
+        } else {
+            settings[known->name] = forPeople(setting.first, setting.second);
+        }
     }
     return settings;
 }

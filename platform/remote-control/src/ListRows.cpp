@@ -29,14 +29,15 @@ bool placeOfDrawn(Elm_Object_Item* item, Rectangle& place) {
 std::string groupOf(const Evas_Object* list, const std::string& style) {
     const char* kind = elm_genlist_mode_get(list) == ELM_LIST_COMPRESS ? "item_compress" : "item";
     const char* listStyle = elm_object_style_get(list);
-    return std::string("elm/genlist/") + kind + "/" + style + "/" + (listStyle ? listStyle : "default");
+    const std::string begin = std::string("elm/genlist/") + kind + "/" + style + "/";
+    return begin + (listStyle ? listStyle : "default");
 }
 
 /// An item out of sight has no object; the list would ask its class, and so do we.
 Element undrawn(Elm_Object_Item* item, Evas_Object* list, const Elm_Genlist_Item_Class& itemClass, ThemeParts& parts) {
     Element element;
     element.type = "Edje";
-    element.group = groupOf(list, itemClass.item_style);
+    element.group = groupOf(list, itemClass.item_style ? itemClass.item_style : "default");
     if (!itemClass.func.text_get) {
         return element;
     }

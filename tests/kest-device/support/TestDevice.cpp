@@ -51,6 +51,12 @@ std::string readOfProcess(const fs::path& file) {
     }
 }
 
+std::vector<std::string> kestDevice(const std::vector<std::string>& words) {
+    std::vector<std::string> command{KEST_DEVICE_PROGRAM};
+    command.insert(command.end(), words.begin(), words.end());
+    return command;
+}
+
 /// Not one that has ended and only waits for its parent to notice.
 bool runs(const fs::path& process) {
     const std::string stat = readOfProcess(process / "stat");
@@ -115,9 +121,8 @@ void TestDevice::setRoot(const fs::path& root) {
     environment_["KEST_DEVICE"] = root_;
 }
 
-pid_t TestDevice::spawn(const std::vector<std::string>& words, const fs::path& out, const fs::path& err) {
-    std::vector<std::string> all{KEST_DEVICE_PROGRAM};
-    all.insert(all.end(), words.begin(), words.end());
+pid_t TestDevice::spawn(const std::vector<std::string>& command, const fs::path& out, const fs::path& err) {
+    std::vector<std::string> all = command;
     std::vector<char*> arguments;
     for (std::string& word : all) {
         arguments.push_back(word.data());
@@ -140,19 +145,35 @@ pid_t TestDevice::spawn(const std::vector<std::string>& words, const fs::path& o
     posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, err.c_str(), O_WRONLY | O_CREAT, 0600);
     posix_spawn_file_actions_addchdir_np(&actions, folder().c_str());
     pid_t process = 0;
-    const int error = posix_spawn(&process, arguments[0], &actions, nullptr, arguments.data(), environment.data());
+    const int error = posix_spawnp(&process, arguments[0], &actions, nullptr, arguments.data(), environment.data());
     posix_spawn_file_actions_destroy(&actions);
     if (error != 0) {
-        throw std::runtime_error("cannot run " KEST_DEVICE_PROGRAM);
+        throw std::runtime_error("cannot run " + command.front());
     }
     return process;
 }
 
 Result TestDevice::run(const std::vector<std::string>& words) {
+    return runCommand(kestDevice(words));
+}
+
+Result TestDevice::runTraced(const std::vector<std::string>& words, const fs::path& trace) {
+    // The leak check of a sanitizer traces the process itself, and two cannot.
+    const auto before = environment_;
+    environment_["ASAN_OPTIONS"] += ":detect_leaks=0";
+    std::vector<std::string> command{"strace", "-D", "-f", "-e", "trace=open,openat", "-o", trace.string()};
+    const std::vector<std::string> traced = kestDevice(words);
+    command.insert(command.end(), traced.begin(), traced.end());
+    const Result result = runCommand(command);
+    environment_ = before;
+    return result;
+}
+
+Result TestDevice::runCommand(const std::vector<std::string>& command) {
     const fs::path out = folder() / ("out." + std::to_string(++runs_));
     const fs::path err = folder() / ("err." + std::to_string(runs_));
     Result result;
-    result.status = waitFor(spawn(words, out, err));
+    result.status = waitFor(spawn(command, out, err));
     result.out = support::readFile(out);
     result.err = support::readFile(err);
     fs::remove(out);
@@ -174,7 +195,7 @@ nlohmann::json TestDevice::json(const std::vector<std::string>& words) {
 
 BackgroundRun TestDevice::runInBackground(const std::vector<std::string>& words) {
     const fs::path out = folder() / ("out." + std::to_string(++runs_));
-    return BackgroundRun(spawn(words, out, folder() / ("err." + std::to_string(runs_))), out);
+    return BackgroundRun(spawn(kestDevice(words), out, folder() / ("err." + std::to_string(runs_))), out);
 }
 
 device::Device TestDevice::open() const {

@@ -63,6 +63,9 @@ public:
     std::string must(const std::vector<std::string>& words);
     /// What a command with --json prints.
     nlohmann::json json(const std::vector<std::string>& words);
+    /// The same, and notes in `trace` every file that it, and what it starts, opens: as strace writes it, until the
+    /// last of them ends. Not possible where processes may not be traced.
+    Result runTraced(const std::vector<std::string>& words, const std::filesystem::path& trace);
     BackgroundRun runInBackground(const std::vector<std::string>& words);
 
     /// Changes the environment of the runs from now on; nullopt takes the variable away.
@@ -82,8 +85,9 @@ public:
     pid_t application();
 
 private:
-    pid_t spawn(const std::vector<std::string>& words, const std::filesystem::path& out,
+    pid_t spawn(const std::vector<std::string>& command, const std::filesystem::path& out,
                 const std::filesystem::path& err);
+    Result runCommand(const std::vector<std::string>& command);
 
     support::TemporaryFolder folder_;
     std::filesystem::path root_;

@@ -55,6 +55,7 @@ void get(Session& session, const Options& options) {
             return;
         }
         std::vector<std::vector<std::string>> rows;
+        rows.reserve(settings.size());
         for (const auto& [name, value] : settings) {
             rows.push_back({name, oneLine(value)});
         }
