@@ -6,8 +6,10 @@ void RatioReport::ReportRuns(const std::vector<Run>& runs) {
     ConsoleReporter::ReportRuns(runs);
     for (const Run& run : runs) {
         if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
-            medians_[run.run_name.function_name + "/" + run.run_name.args] =
-                run.GetAdjustedCPUTime() * 1e6 / benchmark::GetTimeUnitMultiplier(run.time_unit);
+            const std::string name = run.run_name.function_name + "/" + run.run_name.args;
+            const double unit = benchmark::GetTimeUnitMultiplier(run.time_unit) / 1e6;
+            processorTimes_[name] = run.GetAdjustedCPUTime() / unit;
+            passedTimes_[name] = run.GetAdjustedRealTime() / unit;
         }
     }
 }

@@ -105,14 +105,20 @@ void printRatios(const bench::RatioReport& report) {
         std::printf("\n");
     };
     const auto ratio = [&](const char* what, const char* to) {
-        return [&report, what, to](int menus) { return report.median(at(what, menus)) / report.median(at(to, menus)); };
+        return [&report, what, to](int menus) {
+            return report.processorTime(at(what, menus)) / report.processorTime(at(to, menus));
+        };
     };
     const auto growth = [&](const char* what) {
         return [&report, what](int menus) {
-            return report.median(at(what, menus)) / menus / (report.median(at(what, sizes[0])) / sizes[0]);
+            return report.processorTime(at(what, menus)) / menus /
+                   (report.processorTime(at(what, sizes[0])) / sizes[0]);
         };
     };
     row("full load / bare parse and its writes (aim: 2.00)", ratio("FullLoad", "BareParseAndWrites"));
+    row("the same, of the time that passes", [&report](int menus) {
+        return report.passedTime(at("FullLoad", menus)) / report.passedTime(at("BareParseAndWrites", menus));
+    });
     row("full load / bare parse", ratio("FullLoad", "BareParse"));
     row("cached load / bare parse", ratio("CachedLoad", "BareParse"));
     row("cached load / full load", ratio("CachedLoad", "FullLoad"));
