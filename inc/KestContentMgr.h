@@ -4,7 +4,7 @@
 #include "KestLoadWork.h"
 #include "KestMarkup.h"
 #include "KestSharedResources.h"
-#include "KestStringTable.h"
+#include "KestTranslator.h"
 
 #include <libxml/tree.h>
 
@@ -36,7 +36,6 @@ private:
     // The main menu file and the detail files.
     std::string __detailPath(const KestContentInfo& record);
     bool __loadMainMenu();
-    static KestContentInfo __readMenu(const xmlNode* menu);
     bool __loadDetailMenu(KestContentInfo& record);
     void __readDetail(xmlNode* node, KestContentInfo& record);
     /// Puts `fragment` in the place of the first `placeholder` in the contents.
@@ -57,10 +56,12 @@ private:
     void __loadStringResource(const KestContentInfo& record);
     /// The translation of the node's "id" attribute, which goes to `usedId`; `text` where there is none.
     std::string __translateById(xmlNode* node, const std::string& domain, const std::string& text, std::string& usedId);
-    bool __isStringAvailable(const std::string& id, const std::string& domain);
-    /// Null when no string file has the id in the display language.
-    const std::string* __findInStringTable(const std::string& id) const;
-    std::string __getString(const std::string& id, const std::string& domain);
+    bool __isStringAvailable(const std::string& id, const std::string& domain) const {
+        return translator.knows(id, domain);
+    }
+    std::string __getString(const std::string& id, const std::string& domain) const {
+        return translator.translate(id, domain);
+    }
     std::string __translateContents(const std::string& domain, const std::string& contents);
 
     // The preference cache and what decides whether it is valid.
@@ -73,11 +74,8 @@ private:
     std::vector<KestContentInfo> contentsList;
     /// Of the load that goes on.
     KestLoadWork work;
-    /// Kept over loads.
-    KestStringTable stringTable;
-    /// The display language as vconf gives it, and whether it gives one; asked once a load.
-    std::string displayLanguage;
-    bool hasDisplayLanguage;
+    /// With the string table, which is kept over loads.
+    KestTranslator translator;
     /// As this load has met them.
     KestSharedResources sharedResources;
 };

@@ -4,14 +4,13 @@
 #include "KestContentCache.h"
 #include "KestLog.h"
 #include "KestMarkup.h"
+#include "KestMenuElement.h"
 #include "KestPackageInfo.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
-#include "KestTextDomain.h"
 #include "KestTextTags.h"
 #include "KestXmlDocument.h"
 
-#include <libintl.h>
 #include <unistd.h>
 #include <vconf.h>
 
@@ -19,8 +18,6 @@ namespace {
 
 const char menuFile[] = "contents/kest_menu.xml";
 const char languageKey[] = "db/menu_widget/language";
-const char ownDomain[] = "kest";
-const char systemDomain[] = "sys_string";
 
 /// More menus than anybody scrolls through; only files that go wrong have them.
 const size_t mostMenus = 20000;
@@ -35,7 +32,7 @@ KestContentMgr* KestContentMgr::getInstance() {
     return &instance;
 }
 
-KestContentMgr::KestContentMgr() : hasDisplayLanguage(false) {
+KestContentMgr::KestContentMgr() {
     KEST_BEGIN();
     loadContentsList(false);
 }
@@ -64,10 +61,9 @@ bool KestContentMgr::loadContentsList(bool force) {
     // Until the load has finished no version is right, so one that is cut short leaves the cache invalid.
     KestContentCache::writeVersion("");
     const KestPlatformString language(vconf_get_str(languageKey));
-    displayLanguage = language.str();
-    hasDisplayLanguage = static_cast<bool>(language);
-    if (hasDisplayLanguage) {
-        KestContentCache::writeLanguage(displayLanguage);
+    translator.useLanguage(language.get());
+    if (language) {
+        KestContentCache::writeLanguage(language.str());
     }
     for (KestContentInfo& record : contentsList) {
         if (!__loadDetailMenu(record)) {
@@ -100,7 +96,7 @@ bool KestContentMgr::__loadMainMenu() {
         if (!KestXmlDocument::isElement(menu, "menu")) {
             continue;
         }
-        const KestContentInfo record = __readMenu(menu);
+        const KestContentInfo record = KestMenuElement::read(menu);
         if (!record.isAvailable) {
             continue;
         }
@@ -119,21 +115,6 @@ bool KestContentMgr::__loadMainMenu() {
 
 std::string KestContentMgr::__detailPath(const KestContentInfo& record) {
     return sharedResources.of(record.appid) + record.path;
-}
-
-KestContentInfo KestContentMgr::__readMenu(const xmlNode* menu) {
-    KestContentInfo record;
-    for (xmlNode* node = menu->children; node; node = node->next) {
-        const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
-        if (KestXmlDocument::isElement(node, "path")) {
-            record.path = text;
-        } else if (KestXmlDocument::isElement(node, "appid")) {
-            record.appid = text;
-        } else if (KestXmlDocument::isElement(node, "state")) {
-            record.isAvailable = text != "NOK" && text.find(KestCommon::getRegion()) != std::string::npos;
-        }
-    }
-    return record;
 }
 
 bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
@@ -254,40 +235,8 @@ void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
         return;
     }
     if (const xmlNode* items = document.findSection("items")) {
-        stringTable.addAll(items);
+        translator.strings().addAll(items);
     }
-}
-
-bool KestContentMgr::__isStringAvailable(const std::string& id, const std::string& domain) {
-    // The text of the empty id is the header of the gettext catalogue.
-    if (id.empty()) {
-        return false;
-    }
-    if (KestTextDomain::hasText(domain, id) || KestTextDomain::hasText(ownDomain, id) ||
-        KestTextDomain::hasText(systemDomain, id)) {
-        return true;
-    }
-    return __findInStringTable(id) != nullptr;
-}
-
-const std::string* KestContentMgr::__findInStringTable(const std::string& id) const {
-    return hasDisplayLanguage ? stringTable.find(displayLanguage, id) : nullptr;
-}
-
-std::string KestContentMgr::__getString(const std::string& id, const std::string& domain) {
-    KestTextDomain::bind(domain, kest_paths::locale);
-    if (KestTextDomain::hasText(ownDomain, id)) {
-        return dgettext(ownDomain, id.c_str());
-    }
-    KestTextDomain::bind(domain, kest_paths::systemLocale);
-    if (KestTextDomain::hasText(domain, id)) {
-        return dgettext(domain.c_str(), id.c_str());
-    }
-    if (KestTextDomain::hasText(systemDomain, id)) {
-        return dgettext(systemDomain, id.c_str());
-    }
-    const std::string* value = __findInStringTable(id);
-    return value ? *value : id;
 }
 
 std::string KestContentMgr::__translateContents(const std::string& domain, const std::string& contents) {

@@ -4,7 +4,7 @@ namespace {
 
 const size_t mebibyte = 1024 * 1024;
 
-/// Each takes less than a second or two on a workstation.
+/// None takes longer than a few seconds.
 const size_t mostTextOfDetail = 1024 * mebibyte;
 const size_t mostText = 4 * mostTextOfDetail;
 const size_t mostFiles = 256 * mebibyte;
