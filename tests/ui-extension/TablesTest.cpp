@@ -24,32 +24,32 @@ protected:
 };
 
 TEST_F(Tables, AColourTableGivesEachClassALightAndADarkColour) {
-    const uxt_color_table_h table = uxt_theme_add_color_table(file(R"(<?xml version="1.0"?>
+    uxt_color_table* const table = uxt_theme_add_color_table(file(R"(<?xml version="1.0"?>
 <!-- the list -->
 <color_table>
   <color class="list/page" light="#FFFFFF" dark="#00000080"/>
   <color class="list &amp; more" light="#abcdef" dark="#ABCDEF"></color>
 </color_table>
 )")
-                                                                  .c_str());
+                                                                 .c_str());
     EXPECT_NE(nullptr, table);
     EXPECT_THAT(device_.logMessages(), IsEmpty());
     uxt_theme_delete_color_table(table);
 }
 
 TEST_F(Tables, AFontTableGivesEachClassAFontAndASize) {
-    const uxt_font_table_h table = uxt_theme_add_font_table(file(R"(<font_table>
+    uxt_font_table* const table = uxt_theme_add_font_table(file(R"(<font_table>
   <font class="list/title" font="Noto Sans:style=Bold" size="44"/>
   <font class="list/text" font="Noto Sans" size="120%"/>
 </font_table>)")
-                                                                .c_str());
+                                                               .c_str());
     EXPECT_NE(nullptr, table);
     EXPECT_THAT(device_.logMessages(), IsEmpty());
     uxt_theme_delete_font_table(table);
 }
 
 TEST_F(Tables, AnEmptyTableIsATable) {
-    const uxt_font_table_h table = uxt_theme_add_font_table(file("<font_table/>").c_str());
+    uxt_font_table* const table = uxt_theme_add_font_table(file("<font_table/>").c_str());
     EXPECT_NE(nullptr, table);
     uxt_theme_delete_font_table(table);
 }
@@ -158,7 +158,7 @@ TEST_F(Tables, NoFileNameAndNoSuchTableAreSaid) {
     EXPECT_EQ(nullptr, uxt_theme_add_color_table(nullptr));
     EXPECT_EQ(nullptr, uxt_theme_add_font_table(""));
     uxt_theme_delete_color_table(nullptr);
-    const uxt_color_table_h table = uxt_theme_add_color_table(file("<color_table/>").c_str());
+    uxt_color_table* const table = uxt_theme_add_color_table(file("<color_table/>").c_str());
     uxt_theme_delete_color_table(table);
     uxt_theme_delete_color_table(table);
     EXPECT_THAT(device_.logMessages(), ElementsAre("E UXT uxt_theme_add_color_table: no file is named",
