@@ -122,6 +122,16 @@ TEST_F(HostileFile, MainMenuMayHave15000Menus) {
     EXPECT_TRUE(result());
 }
 
+TEST_F(HostileFile, LongDetailsOfManyTipsAreReadAsFarAsALoadGoes) {
+    writeMenus(std::vector<Menu>(40));
+    writeDetail("<title>Title</title><!--" + std::string(15 << 20, ' ') + "-->");
+    const auto records = load();
+    ASSERT_EQ(records.size(), 40U);
+    EXPECT_EQ(records.front().menuTitle, "Title");
+    EXPECT_EQ(records.back().menuTitle, "") << "a quarter of a gigabyte has been read by then";
+    EXPECT_THAT(errors(), testing::Contains(error("__loadDetailMenu", "Failed to xmlReadFile")));
+}
+
 TEST_F(HostileFile, MainMenuMayHaveMoreMenusThanAnybodyScrollsThrough) {
     writeDetail("<title>Title</title>");
     setPreference("KestCurrentLanguage", "en_US.UTF-8");

@@ -198,16 +198,6 @@ TEST_F(HostileText, OfOneTipDoesNotSpoilAnother) {
     }
 }
 
-TEST_F(HostileText, OfAThousandTipsEndsAllTheSame) {
-    const std::string tag = "<text id=\"IDS_A\">" + std::string(900000, 'x') + "</text>";
-    writeStrings({{"en", "IDS_A", tag}});
-    writeMenus(std::vector<kest_files::Menu>(1000));
-    writeDetail(contents(textTag("IDS_A")));
-    EXPECT_EQ(load().size(), 1000U);
-    EXPECT_THAT(errors(), Contains(error("__loadDetailMenu", "Failed to xmlReadFile")))
-        << "no load reads hundreds of megabytes";
-}
-
 TEST_F(HostileText, DomainsMayBeThousandsOfWhichTheFirstOnesCount) {
     std::string domains;
     for (int i = 0; i < 2048; ++i)

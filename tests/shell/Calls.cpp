@@ -131,7 +131,8 @@ CALL(int, ravella_log_manager_insert, ravella_log_manager_h handle, const char* 
 
 CALL(int, ravella_log_manager_destroy, ravella_log_manager_h handle) {
     note("ravella_log_manager_destroy");
-    return __real_ravella_log_manager_destroy(handle);
+    const int result = __real_ravella_log_manager_destroy(handle);
+    return fails("ravella_log_manager_destroy") ? -5 : result;
 }
 
 CALL(void, elm_app_base_scale_set, double scale) {

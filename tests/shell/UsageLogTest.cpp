@@ -57,7 +57,7 @@ TEST_F(UsageLog, MayRefuseARecord) {
 }
 
 TEST_F(UsageLog, MayRefuseToClose) {
-    device::faults::plan("ravella_log_manager_destroy", -5);
+    calls::fail("ravella_log_manager_destroy");
     KestUsageLog::menuChosen("A");
     EXPECT_EQ(device()->usage().all().size(), 1U);
     EXPECT_THAT(kest_log::all(device()), IsEmpty());

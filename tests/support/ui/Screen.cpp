@@ -74,7 +74,9 @@ void Screen::takeFocus() {
 
 Picture Screen::picture() {
     Ecore_Evas* frame = ecore_evas_ecore_evas_get(canvas());
-    ecore_evas_manual_render(frame);
+    // Waits for a frame that a thread still draws, then draws what has changed since here.
+    evas_sync(canvas());
+    evas_render(canvas());
     int width = 0, height = 0;
     ecore_evas_geometry_get(frame, nullptr, nullptr, &width, &height);
     return Picture(width, height, static_cast<const unsigned int*>(ecore_evas_buffer_pixels_get(frame)));
