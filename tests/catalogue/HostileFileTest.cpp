@@ -3,7 +3,6 @@
 using namespace manager_log;
 using kest_files::contents;
 using kest_files::detail;
-using kest_files::Menu;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;

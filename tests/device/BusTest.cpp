@@ -10,7 +10,6 @@
 
 namespace {
 
-using device::Bus;
 using device::BusName;
 using device::Folder;
 using support::Environment;
