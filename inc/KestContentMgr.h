@@ -34,7 +34,7 @@ private:
     KestContentMgr();
 
     // The main menu file and the detail files.
-    std::string __detailPath(const KestContentInfo& record);
+    std::string __detailPath(const KestContentInfo& record) { return sharedResources.of(record.appid) + record.path; }
     bool __loadMainMenu();
     bool __loadDetailMenu(KestContentInfo& record);
     void __readDetail(xmlNode* node, KestContentInfo& record);

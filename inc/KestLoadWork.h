@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 
 /// What one load of the catalogue may still do, so that it ends on any input: files can refer to themselves, and
 /// any number of menus to the same file. A catalogue that is meant to be read needs a hundredth of it.
@@ -11,12 +12,13 @@ public:
     /// Begins the next detail file, which has a share of its own: one that uses it up does not spoil the others.
     void beginDetail();
     /// Takes the work of handling one text: of so many bytes in all. False when there is not as much left.
-    bool spendOnText(size_t bytes);
+    bool spendOnText(std::uint64_t bytes);
     /// Takes the parsing of a file of so many bytes.
-    bool spendOnFile(size_t bytes);
+    bool spendOnFile(std::uint64_t bytes);
 
 private:
-    size_t textBytes;
-    size_t detailTextBytes;
-    size_t fileBytes;
+    // More than a 32-bit device can count in a size_t.
+    std::uint64_t textBytes;
+    std::uint64_t detailTextBytes;
+    std::uint64_t fileBytes;
 };

@@ -22,8 +22,9 @@ const char languageKey[] = "db/menu_widget/language";
 /// More menus than anybody scrolls through; only files that go wrong have them.
 const size_t mostMenus = 20000;
 
-/// Text is moved so much faster than it is looked up.
-const size_t passesToMove = 16;
+/// Text is moved so much faster than it is handled, and handled so many times until it is translated.
+const std::uint64_t passesToMove = 16;
+const std::uint64_t passesOverText = 32;
 
 }  // namespace
 
@@ -111,10 +112,6 @@ bool KestContentMgr::__loadMainMenu() {
         }
     }
     return true;
-}
-
-std::string KestContentMgr::__detailPath(const KestContentInfo& record) {
-    return sharedResources.of(record.appid) + record.path;
 }
 
 bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
@@ -205,13 +202,18 @@ std::string KestContentMgr::__translateById(xmlNode* node, const std::string& do
     if (!id || !work.spendOnText(0) || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
         return text;
     }
+    const std::string translation = __getString(KestXmlDocument::str(id), domain);
+    if (!work.spendOnText(passesOverText * translation.size())) {
+        return text;
+    }
     usedId = KestXmlDocument::str(id);
-    return __getString(usedId, domain);
+    return translation;
 }
 
 void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
     const std::string translated = __translateContents(record.textdomain, cleaned);
-    record.textContents = __convertHrefPath(record.appid, translated);
+    record.textContents =
+        work.spendOnText(translated.size()) ? __convertHrefPath(record.appid, translated) : translated;
     if (record.textContents.empty()) {
         record.textContents = text;
     }
@@ -249,7 +251,9 @@ std::string KestContentMgr::__translateContents(const std::string& domain, const
         }
         const std::string value = __getString(id, domain);
         // Markup only makes it longer.
-        if (value.size() > KestTextTags::longestContents || !tags.replaceFirst(KestMarkup::fromTranslation(value))) {
+        if (value.size() > KestTextTags::longestContents ||
+            !work.spendOnText(passesOverText * (tag.size() + value.size())) ||
+            !tags.replaceFirst(KestMarkup::fromTranslation(value))) {
             KEST_INFO("xml contents error: text id string part");
             break;
         }

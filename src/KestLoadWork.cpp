@@ -2,17 +2,17 @@
 
 namespace {
 
-const size_t mebibyte = 1024 * 1024;
+const std::uint64_t mebibyte = 1024 * 1024;
 
 /// None takes longer than a few seconds.
-const size_t mostTextOfDetail = 1024 * mebibyte;
-const size_t mostText = 4 * mostTextOfDetail;
-const size_t mostFiles = 256 * mebibyte;
+const std::uint64_t mostTextOfDetail = 1024 * mebibyte;
+const std::uint64_t mostText = 4 * mostTextOfDetail;
+const std::uint64_t mostFiles = 256 * mebibyte;
 
 /// Looking up a short text costs as much as copying one of this length.
-const size_t leastText = 4096;
+const std::uint64_t leastText = 4096;
 
-bool take(size_t& left, size_t amount) {
+bool take(std::uint64_t& left, std::uint64_t amount) {
     if (amount > left) {
         return false;
     }
@@ -28,10 +28,11 @@ void KestLoadWork::beginDetail() {
     detailTextBytes = mostTextOfDetail;
 }
 
-bool KestLoadWork::spendOnText(size_t bytes) {
-    return bytes <= textBytes && take(detailTextBytes, leastText + bytes) && take(textBytes, leastText + bytes);
+bool KestLoadWork::spendOnText(std::uint64_t bytes) {
+    return leastText + bytes <= textBytes && take(detailTextBytes, leastText + bytes) &&
+           take(textBytes, leastText + bytes);
 }
 
-bool KestLoadWork::spendOnFile(size_t bytes) {
+bool KestLoadWork::spendOnFile(std::uint64_t bytes) {
     return take(fileBytes, bytes);
 }

@@ -8,11 +8,12 @@ namespace {
 
 const size_t longestName = 200;
 
-/// gettext keeps every domain that it was ever asked for, in a list.
-const size_t mostDomains = 2048;
+/// gettext keeps every domain that it was ever asked for, in a list that it goes through for each text.
+const size_t mostDomains = 256;
 
 bool isDomain(const std::string& domain) {
-    static std::set<std::string> known;
+    // Those that are asked for in every tip have their places.
+    static std::set<std::string> known = {"kest", "sys_string"};
     if (domain.size() > longestName || domain.find('/') != std::string::npos) {
         return false;
     }

@@ -9,9 +9,9 @@ namespace {
 const char tagBegin[] = "<text";
 const char tagEnd[] = "</text>";
 
-/// A tag and its value are searched, looked up and copied several times, the contents only moved.
-const size_t passesOverText = 8;
-const size_t passesToMove = 16;
+/// A value is searched and copied several times, the contents only moved.
+const std::uint64_t passesOverText = 8;
+const std::uint64_t passesToMove = 16;
 
 }  // namespace
 
@@ -50,7 +50,7 @@ bool KestTextTags::replaceFirst(const std::string& value) {
     if (contents.size() > longestContents || value.size() > (longestContents - kept) / count) {
         return false;
     }
-    if (!work.spendOnText(passesOverText * (tag.size() + count * value.size()) + contents.size() / passesToMove)) {
+    if (!work.spendOnText(passesOverText * count * value.size() + contents.size() / passesToMove)) {
         return false;
     }
     ++replacements;

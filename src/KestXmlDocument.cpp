@@ -10,7 +10,10 @@ namespace {
 const int recoverFromErrors = 1;
 
 /// More text than the entities of any file of a catalogue stand for.
-const size_t mostReferredText = 16 * 1024 * 1024;
+const size_t mostReferredText = 1024 * 1024;
+
+/// What reading an element or a reference costs beside its text, in bytes of text.
+const size_t costOfNode = 16;
 
 void freeText(xmlChar* text) {
     xmlFree(text);
@@ -81,6 +84,7 @@ private:
     size_t lengthOf(const xmlNode* first, bool withPlainText) {
         size_t length = 0;
         for (const xmlNode* node = first; node && length <= mostReferredText; node = node->next) {
+            length += withPlainText || node->type == XML_ENTITY_REF_NODE ? costOfNode : 0;
             if (node->type == XML_ENTITY_REF_NODE) {
                 length += lengthOf(xmlGetDocEntity(node->doc, node->name));
             } else if (node->type == XML_ELEMENT_NODE) {
@@ -145,8 +149,11 @@ bool KestXmlDocument::read(const std::string& path, KestLoadWork& work) {
     }
     xmlNode* root = xmlDocGetRootElement(document.get());
     // Without declarations of its own a document has no entity that stands for more than a character.
-    if (document->intSubset && ReferredText().lengthIn(document.get()) > mostReferredText) {
-        removeReferences(root);
+    if (document->intSubset) {
+        const size_t referred = ReferredText().lengthIn(document.get());
+        if (referred > mostReferredText || !work.spendOnFile(referred)) {
+            removeReferences(root);
+        }
     }
     return root && root->children;
 }
@@ -172,5 +179,13 @@ KestXmlDocument::Text KestXmlDocument::content(xmlNode* node) {
 }
 
 KestXmlDocument::Text KestXmlDocument::attribute(xmlNode* node, const char* name) {
-    return Text(xmlGetProp(node, reinterpret_cast<const xmlChar*>(name)), freeText);
+    const xmlAttr* attribute = xmlHasProp(node, reinterpret_cast<const xmlChar*>(name));
+    if (!attribute) {
+        return Text(nullptr, freeText);
+    }
+    // Other than xmlGetProp() it takes no longer for a value of many references.
+    const std::unique_ptr<xmlBuffer, void (*)(xmlBuffer*)> buffer(xmlBufferCreate(), xmlBufferFree);
+    xmlNodeBufGetContent(buffer.get(), reinterpret_cast<const xmlNode*>(attribute));
+    const xmlChar* value = xmlBufferContent(buffer.get());
+    return Text(xmlStrdup(value ? value : reinterpret_cast<const xmlChar*>("")), freeText);
 }

@@ -194,6 +194,39 @@ TEST_F(HostileXml, MayHaveThousandsOfEscapedTextTags) {
     EXPECT_EQ(loadDetail(plain("<contents>" + tags + "</contents>")).textContents, repeated("Own text", 5000));
 }
 
+TEST_F(HostileXml, MayHaveHundredsOfQuotesInASectionOrAComment) {
+    const std::string quotes = "x < y " + repeated("\"x\" xmlns ", 300);
+    EXPECT_EQ(
+        loadDetail(plain("<!-- " + quotes + "--><?note " + quotes + "?><title><![CDATA[" + quotes + "]]></title>"))
+            .menuTitle,
+        quotes);
+}
+
+TEST_F(HostileXml, MayNameAFewNamespaces) {
+    EXPECT_EQ(loadDetail("<tip xmlns='a' xmlns:b='b'><items><item><title>Title</title></item></items></tip>").menuTitle,
+              "Title");
+}
+
+TEST_F(HostileXml, CannotHideAttributesBehindWhatLooksLikeAComment) {
+    const std::string tag = withAttributes(257, "='x'");
+    expectNotParsed("<?x <!-- ?>" + tag + "<?y --> ?>");
+    expectNotParsed("<!-- <![CDATA[ -->" + tag + "<!-- ]]> -->");
+    expectNotParsed("<!-- <? -->" + tag + "<?y ?>");
+    expectNotParsed(repeated("<!--", 100000) + tag);
+}
+
+TEST_F(HostileXml, ManyElementsOfEntitiesAreLeftOut) {
+    const std::string declarations = entity("a", repeated("<x/>", 5000)) + entity("b", repeated("&a;", 5000));
+    EXPECT_EQ(loadDetail(file(declarations, "<title>a" + repeated("&b;", 60) + "c</title>")).menuTitle, "ac");
+}
+
+TEST_F(HostileXml, AnIdMayBeManyReferences) {
+    writeStringFile("<strings><items><item><region>en</region><stringid>" + std::string(8000, 'a') +
+                    "</stringid><value>Mine</value></item></items></strings>");
+    EXPECT_EQ(loadDetail(file(entity("a", "aa"), "<title id='" + repeated("&a;", 4000) + "'>x</title>")).menuTitle,
+              "Mine");
+}
+
 TEST_F(HostileXml, IsNotParsedWithHundredsOfNamespaces) {
     // Every element with a prefix asks for it among all of them.
     std::string declarations;

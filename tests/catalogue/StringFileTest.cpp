@@ -180,3 +180,10 @@ TEST_F(StringFile, IsReadBeforeTheDetailFileThatNeedsIt) {
     EXPECT_EQ(loadTip("<title id=\"IDS_MINE\">x</title>" + contents(textTag("IDS_MINE") + " and <br/>")).textContents,
               "Mine and <br/>");
 }
+
+TEST_F(StringFile, IsNoHelpOnceTheDeviceNamesNoLanguageAnyMore) {
+    writeStrings({{"en_US", "IDS_MINE", "Mine"}});
+    ASSERT_EQ(loadTip("<title id=\"IDS_MINE\">untranslated</title>").menuTitle, "Mine");
+    device()->settings().remove(device::keys::language);
+    EXPECT_EQ(load().at(0).menuTitle, "untranslated");
+}

@@ -49,6 +49,15 @@ TEST_F(TextTag, MayBeginInATranslation) {
     }
 }
 
+TEST_F(TextTag, MayEndInATranslation) {
+    for (std::size_t length = 1; length < sizeof("<text") - 1; ++length) {
+        writeStrings({{"en", "IDS_A", std::string("<text").substr(length) + " id=\"IDS_SYSTEM\">x</text>"}});
+        EXPECT_EQ(loadContents("before " + std::string("<text").substr(0, length) + textTag("IDS_A") + " after"),
+                  "before System text after")
+            << length;
+    }
+}
+
 TEST_F(TextTag, WithABlankAfterItsIdIsFaultyAndAllThatIsLeft) {
     EXPECT_EQ(loadContents("before <text id=\"IDS_A\" >Hi</text> after"), "Hi");
     EXPECT_TRUE(sawFaultyTag());
