@@ -202,7 +202,7 @@ std::string KestContentMgr::__translateById(xmlNode* node, const std::string& do
     if (!id || !work.spendOnText(0) || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
         return text;
     }
-    const std::string translation = __getString(KestXmlDocument::str(id), domain);
+    std::string translation = __getString(KestXmlDocument::str(id), domain);
     if (!work.spendOnText(passesOverText * translation.size())) {
         return text;
     }

@@ -57,9 +57,9 @@ TEST_F(Fonts, OfOneObjectWinOverTheApplications) {
     uxt_theme_object_set_changeable_ui_enabled(own, EINA_TRUE);
     uxt_theme_object_set_font_table(own, largeTable());
     EXPECT_NEAR(2 * height, heightOf(own), 2);
-    EXPECT_NEAR(height / 2, heightOf(other), 2);
+    EXPECT_NEAR(height / 2.0, heightOf(other), 2);
     uxt_theme_object_set_changeable_ui_enabled(own, EINA_FALSE);
-    EXPECT_NEAR(height / 2, heightOf(own), 2);
+    EXPECT_NEAR(height / 2.0, heightOf(own), 2);
 }
 
 }  // namespace
