@@ -9,6 +9,9 @@ class KestLoadWork {
 public:
     KestLoadWork();
 
+    /// What moving so many bytes of text costs, beside handling them.
+    static std::uint64_t ofMoving(std::uint64_t bytes) { return bytes / 16; }
+
     /// Begins the next detail file, which has a share of its own: one that uses it up does not spoil the others.
     void beginDetail();
     /// Takes the work of handling one text: of so many bytes in all. False when there is not as much left.

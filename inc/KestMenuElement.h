@@ -4,9 +4,11 @@
 
 #include <libxml/tree.h>
 
+#include <string>
+
 /// A "menu" element of the main menu file. Static; holds no state.
 class KestMenuElement {
 public:
-    /// A fresh record with what the element says: path, application, and whether the tip is offered in this region.
-    static KestContentInfo read(const xmlNode* menu);
+    /// A fresh record with what the element says: path, application, and whether the tip is offered in the region.
+    static KestContentInfo read(const xmlNode* menu, const std::string& region);
 };

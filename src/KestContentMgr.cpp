@@ -22,8 +22,7 @@ const char languageKey[] = "db/menu_widget/language";
 /// More menus than anybody scrolls through; only files that go wrong have them.
 const size_t mostMenus = 20000;
 
-/// Text is moved so much faster than it is handled, and handled so many times until it is translated.
-const std::uint64_t passesToMove = 16;
+/// A text is searched, looked up, marked up and copied so many times until it is translated.
 const std::uint64_t passesOverText = 32;
 
 }  // namespace
@@ -92,12 +91,13 @@ bool KestContentMgr::__loadMainMenu() {
         return false;
     }
     const xmlNode* menus = document.findSection("menus");
+    const std::string region = KestCommon::getRegion();
     size_t offered = 0;
     for (xmlNode* menu = menus ? menus->children : nullptr; menu; menu = menu->next) {
         if (!KestXmlDocument::isElement(menu, "menu")) {
             continue;
         }
-        const KestContentInfo record = KestMenuElement::read(menu);
+        const KestContentInfo record = KestMenuElement::read(menu, region);
         if (!record.isAvailable) {
             continue;
         }
@@ -186,7 +186,7 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
 }
 
 void KestContentMgr::__attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment) {
-    if (!work.spendOnText(record.textContents.size() / passesToMove)) {
+    if (!work.spendOnText(KestLoadWork::ofMoving(record.textContents.size()))) {
         KEST_WARN("too much to attach: %s", record.path.c_str());
         return;
     }
@@ -199,14 +199,15 @@ void KestContentMgr::__attach(KestContentInfo& record, const std::string& placeh
 std::string KestContentMgr::__translateById(xmlNode* node, const std::string& domain, const std::string& text,
                                             std::string& usedId) {
     const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
-    if (!id || !work.spendOnText(0) || !__isStringAvailable(KestXmlDocument::str(id), domain)) {
+    const std::string name = KestXmlDocument::str(id);
+    if (!id || !work.spendOnText(0) || !__isStringAvailable(name, domain)) {
         return text;
     }
-    std::string translation = __getString(KestXmlDocument::str(id), domain);
+    std::string translation = __getString(name, domain);
     if (!work.spendOnText(passesOverText * translation.size())) {
         return text;
     }
-    usedId = KestXmlDocument::str(id);
+    usedId = name;
     return translation;
 }
 

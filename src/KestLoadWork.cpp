@@ -4,7 +4,6 @@ namespace {
 
 const std::uint64_t mebibyte = 1024 * 1024;
 
-/// None takes longer than a few seconds.
 const std::uint64_t mostTextOfDetail = 1024 * mebibyte;
 const std::uint64_t mostText = 4 * mostTextOfDetail;
 const std::uint64_t mostFiles = 256 * mebibyte;
@@ -29,8 +28,8 @@ void KestLoadWork::beginDetail() {
 }
 
 bool KestLoadWork::spendOnText(std::uint64_t bytes) {
-    return leastText + bytes <= textBytes && take(detailTextBytes, leastText + bytes) &&
-           take(textBytes, leastText + bytes);
+    const std::uint64_t cost = leastText + bytes;
+    return cost <= textBytes && take(detailTextBytes, cost) && take(textBytes, cost);
 }
 
 bool KestLoadWork::spendOnFile(std::uint64_t bytes) {

@@ -9,9 +9,8 @@ namespace {
 const char tagBegin[] = "<text";
 const char tagEnd[] = "</text>";
 
-/// A value is searched and copied several times, the contents only moved.
-const std::uint64_t passesOverText = 8;
-const std::uint64_t passesToMove = 16;
+/// A value is searched and copied so many times where it is put in.
+const std::uint64_t passesOverValue = 8;
 
 }  // namespace
 
@@ -50,7 +49,7 @@ bool KestTextTags::replaceFirst(const std::string& value) {
     if (contents.size() > longestContents || value.size() > (longestContents - kept) / count) {
         return false;
     }
-    if (!work.spendOnText(passesOverText * count * value.size() + contents.size() / passesToMove)) {
+    if (!work.spendOnText(passesOverValue * count * value.size() + KestLoadWork::ofMoving(contents.size()))) {
         return false;
     }
     ++replacements;

@@ -26,11 +26,11 @@ class Markup {
 public:
     explicit Markup(const std::string& whole) : text(whole) {}
 
-    bool isTooMuch(bool hasDocumentType) {
+    bool isTooMuch(bool withDocumentType) {
         for (size_t at = 0; at < text.size() && !tooMuch; ++at) {
             if (text[at] == '<') {
                 // In a document type the same characters may mean something else.
-                at = hasDocumentType ? at : __skipSection(at);
+                at = withDocumentType ? at : __skipSection(at);
                 __beginTag();
             } else if (inTag) {
                 __read(at);

@@ -1,11 +1,11 @@
-#include "FullDisk.h"
 #include "ToolTest.h"
 
+#include "support/FullDisk.h"
 #include "support/PrivateBus.h"
 
 #include <csignal>
 
-using test_tool::FullDisk;
+using support::FullDisk;
 using testing::IsEmpty;
 using testing::StartsWith;
 

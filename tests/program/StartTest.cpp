@@ -1,6 +1,6 @@
-#include "FullDisk.h"
 #include "ProgramTest.h"
 
+#include "support/FullDisk.h"
 #include "support/PrivateBus.h"
 
 #include <csignal>
@@ -94,7 +94,7 @@ TEST_F(Program, OnADiskThatFillsUpDuringItsFirstStartShowsItsListAtALaterOne) {
     for (const rlim_t kilobytes : {38, 40, 44, 60, 80}) {
         test_tool::TestDevice full;
         {
-            const test_tool::FullDisk disk(kilobytes * 512);
+            const support::FullDisk disk(kilobytes * 512);
             full.run({"start", "--headless"});
         }
         full.must({"stop"});

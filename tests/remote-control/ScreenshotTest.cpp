@@ -1,12 +1,11 @@
 #include "Screenshot.h"
 
 #include "SampleTest.h"
+#include "support/FullDisk.h"
 #include "support/TemporaryFolder.h"
 
-#include <csignal>
-#include <sys/resource.h>
-
 using remote_control::writeScreenshot;
+using support::FullDisk;
 using testing::ElementsAre;
 
 namespace {
@@ -37,27 +36,6 @@ protected:
     }
 
     support::TemporaryFolder folder_;
-};
-
-/// No file may grow past `bytes` meanwhile: what a full disk does.
-class FullDisk {
-public:
-    explicit FullDisk(rlim_t bytes) {
-        getrlimit(RLIMIT_FSIZE, &before_);
-        signal_ = std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{bytes, before_.rlim_max};
-        setrlimit(RLIMIT_FSIZE, &limit);
-    }
-    ~FullDisk() {
-        setrlimit(RLIMIT_FSIZE, &before_);
-        std::signal(SIGXFSZ, signal_);
-    }
-    FullDisk(const FullDisk&) = delete;
-    FullDisk& operator=(const FullDisk&) = delete;
-
-private:
-    rlimit before_{};
-    void (*signal_)(int);
 };
 
 }  // namespace

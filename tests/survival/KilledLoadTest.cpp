@@ -113,12 +113,7 @@ protected:
 
     /// Kills a process so long after it has begun a full load; true when it was still at it.
     bool killFullLoadAfter(Clock::duration delay) const {
-        Child child([this](int pipe) {
-            openDevice();
-            KestContentMgr* manager = KestContentMgr::getInstance();
-            [[maybe_unused]] const ssize_t written = write(pipe, "!", 1);
-            manager->loadContentsList(true);
-        });
+        Child child = processInFullLoad();
         child.waitForFirstByte();
         std::this_thread::sleep_for(delay);
         child.kill();
@@ -126,12 +121,7 @@ protected:
     }
 
     Clock::duration timeOfFullLoad() const {
-        Child child([this](int pipe) {
-            openDevice();
-            KestContentMgr* manager = KestContentMgr::getInstance();
-            [[maybe_unused]] const ssize_t written = write(pipe, "!", 1);
-            manager->loadContentsList(true);
-        });
+        Child child = processInFullLoad();
         child.waitForFirstByte();
         const auto start = Clock::now();
         child.wait();
@@ -139,6 +129,16 @@ protected:
     }
 
 private:
+    /// One that writes a byte and begins a full load.
+    Child processInFullLoad() const {
+        return Child([this](int pipe) {
+            openDevice();
+            KestContentMgr* manager = KestContentMgr::getInstance();
+            [[maybe_unused]] const ssize_t written = write(pipe, "!", 1);
+            manager->loadContentsList(true);
+        });
+    }
+
     static std::string pathOf(int menu) { return "contents/tip" + std::to_string(menu) + ".xml"; }
     std::filesystem::path resources() const { return device_.appRoot() / "shared/res"; }
     void openDevice() const {

@@ -3,7 +3,7 @@
 #include <csignal>
 #include <sys/resource.h>
 
-namespace test_tool {
+namespace support {
 
 /// No file may grow past `bytes` meanwhile, in this process and those that it starts: what a full disk does.
 class FullDisk {
@@ -26,4 +26,4 @@ private:
     void (*signal_)(int);
 };
 
-}  // namespace test_tool
+}  // namespace support
