@@ -62,6 +62,19 @@ TEST_F(Application, AWindowOfTheFrameworksMakingShows) {
     EXPECT_TRUE(evas_object_visible_get(running.window()));
 }
 
+TEST_F(Application, ItsFirstFrameHasWhatTheFirstRequestAskedFor) {
+    app_.inCreate = [this] { app_.attachWindow(new app_assist::WWindow("Sample", ELM_WIN_BASIC)); };
+    RunningApp running(app_);
+    app_.story.clear();
+    const auto tell = [](void* app, Evas*, void*) { static_cast<TellingApp*>(app)->story.emplace_back("frame"); };
+    evas_event_callback_add(evas_object_evas_get(running.window()), EVAS_CALLBACK_RENDER_PRE, tell, &app_);
+    test_ui::runFor(1.0);
+    ASSERT_GE(app_.story.size(), 3U);
+    EXPECT_THAT(std::vector(app_.story.begin(), app_.story.begin() + 3),
+                ElementsAre("onAppControl com.example.app first", "onResume", "frame"));
+    evas_event_callback_del(evas_object_evas_get(running.window()), EVAS_CALLBACK_RENDER_PRE, tell);
+}
+
 TEST_F(Application, TheObjectIsTheProcesssForItsLife) {
     EXPECT_EQ(&app_, WApp::getInstance());
     {

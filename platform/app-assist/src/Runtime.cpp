@@ -136,12 +136,14 @@ int Runtime::sayRunning() const {
 }
 
 void Runtime::queueFirstRequest() {
-    // From inside the main loop, so that it can end the application.
-    firstRequest_ = ecore_job_add(
-        [](void* data) {
+    // From inside the main loop, so that it can end the application, and before the loop draws for the first time: the
+    // first frame has what the request asked for, and no empty one is waited for.
+    firstRequest_ = ecore_idle_enterer_before_add(
+        [](void* data) -> Eina_Bool {
             auto* self = static_cast<Runtime*>(data);
             self->firstRequest_ = nullptr;
             guarded("a launch request", [self] { self->deliver(self->extras_); });
+            return ECORE_CALLBACK_CANCEL;
         },
         this);
 }
@@ -179,7 +181,7 @@ void Runtime::useTheme() const {
 
 void Runtime::end() {
     if (firstRequest_)
-        ecore_job_del(std::exchange(firstRequest_, nullptr));
+        ecore_idle_enterer_del(std::exchange(firstRequest_, nullptr));
     app_.endSight();
     if (std::exchange(created_, false))
         guarded("onTerminate", [this] { app_.onTerminate(); });

@@ -52,7 +52,7 @@ private:
     std::optional<InstanceLock> instance_;
     device::Events::Subscription settings_;
     LaunchRequest::Extras extras_;
-    Ecore_Job* firstRequest_ = nullptr;
+    Ecore_Idle_Enterer* firstRequest_ = nullptr;
     bool created_ = false;
     bool firstLaunch_ = true;
 };
