@@ -83,6 +83,24 @@ TEST_F(List, CutsALongTextBeforeTheMargin) {
     EXPECT_EQ(1, picture.colours({684, 188, 36, 140}));
 }
 
+TEST_F(List, DrawsALettersHookAtTheStartOfARow) {
+    start();
+    pushList({{"Exercise", "J"}, {"Exercise", "JJ"}});
+    const auto picture = screen().picture();
+    const auto inkOfRow = [&](int row) {
+        int ink = 0;
+        for (int y = 0; y < 60; ++y) {
+            for (int x = 0; x < 100; ++x) {
+                ink += static_cast<int>(lightPage & 255) -
+                       static_cast<int>(picture.pixel(140 + x, 188 + 148 * row + 70 + y) & 255);
+            }
+        }
+        return ink;
+    };
+    EXPECT_GT(inkOfRow(0), 10000);
+    EXPECT_NEAR(1, 2.0 * inkOfRow(0) / inkOfRow(1), 0.02) << "only the first letter of a text can be cut";
+}
+
 TEST_F(List, IsMirroredWhereOneReadsFromRightToLeft) {
     start();
     elm_config_mirrored_set(EINA_TRUE);
