@@ -40,6 +40,17 @@ TEST(Database, IsWrittenAheadAndCarriesTheVersionOfItsSchema) {
     EXPECT_EQ(sql.execAndGet("PRAGMA user_version").getInt(), 1);
 }
 
+TEST(Database, IsItsUsersAloneInAFolderThatEverybodyReads) {
+    const TemporaryFolder there;
+    const auto options = optionsFor(there.path() / "device");
+    std::filesystem::create_directory(options.folder.root());
+    std::filesystem::permissions(options.folder.root(), std::filesystem::perms(0755));
+    Device device(options);
+    device.preferences().set("com.example.app", "key", "value");
+    for (const auto& file : std::filesystem::directory_iterator(options.folder.root()))
+        EXPECT_EQ(std::filesystem::status(file).permissions(), std::filesystem::perms(0600)) << file.path();
+}
+
 TEST(Database, IsMadeOnceWhenManyProcessesMakeIt) {
     const TemporaryFolder there;
     std::vector<Process> processes;

@@ -3,6 +3,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sqlite3.h>
 
 namespace {
 
@@ -62,21 +63,81 @@ TEST(Preferences, OfEveryApplicationGoInACustomisationReset) {
     EXPECT_THAT(device->preferences().applications(), IsEmpty());
 }
 
-TEST(Preferences, OfAnApplicationAreWrittenNoMoreOnceAWriteHasFailed) {
-    TemporaryDevice device;
-    device->database().sql().exec("PRAGMA max_page_count = 20");
-    device->preferences().setUnlessOneFailed("com.example.app", "before", "value");
-    const std::string failure = messageOf(
-        [&] { device->preferences().setUnlessOneFailed("com.example.app", "long", std::string(1 << 20, 'x')); });
-    EXPECT_EQ(failure, device.root().string() +
-                           "/device.db: the disk is full (database or disk is full); free some space and try again");
-    EXPECT_EQ(messageOf([&] { device->preferences().setUnlessOneFailed("com.example.app", "short", "value"); }),
-              failure);
-    EXPECT_THAT(device->preferences().all("com.example.app"), ElementsAre(Pair("before", "value")));
+constexpr char app[] = "com.example.app";
 
-    device.reopen();
-    device->preferences().setUnlessOneFailed("com.example.app", "short", "value");
-    EXPECT_EQ(device->preferences().get("com.example.app", "short"), "value");
+/// A device whose disk takes no large value until it is freed.
+class FullDevice : public testing::Test {
+protected:
+    FullDevice() { device_->database().sql().exec("PRAGMA max_page_count = 20"); }
+    void free() { device_->database().sql().exec("PRAGMA max_page_count = 10000"); }
+    std::string failureOf(const std::string& key, const std::string& value) {
+        return messageOf([&] { device_->preferences().setInOrder(app, key, value); });
+    }
+
+    TemporaryDevice device_;
+    const std::string full_ = device_.root().string() +
+                              "/device.db: the disk is full (database or disk is full); free some space and try again";
+};
+
+TEST_F(FullDevice, KeepsNothingThatAnApplicationWritesAfterWhatItCannotKeep) {
+    device_->preferences().setInOrder(app, "before", "value");
+    EXPECT_EQ(failureOf("long", std::string(1 << 20, 'x')), full_);
+    EXPECT_EQ(failureOf("short", "value"), full_);
+    EXPECT_THAT(device_->preferences().all(app), ElementsAre(Pair("before", "value")));
+}
+
+TEST_F(FullDevice, HasEverythingOnceThereIsSpaceAgain) {
+    const std::string large(1 << 20, 'x');
+    failureOf("long", large);
+    failureOf("short", "old");
+    failureOf("short", "new");
+    free();
+    device_->preferences().setInOrder(app, "last", "value");
+    EXPECT_THAT(device_->preferences().all(app),
+                ElementsAre(Pair("last", "value"), Pair("long", large), Pair("short", "new")));
+}
+
+TEST_F(FullDevice, IsGivenWhatItCouldNotKeepWhenItIsClosed) {
+    failureOf("long", std::string(1 << 20, 'x'));
+    failureOf("short", "value");
+    free();
+    device_.reopen();
+    EXPECT_EQ(device_->preferences().all(app).size(), 2U);
+}
+
+TEST_F(FullDevice, IsNotGivenWhatWasClearedMeanwhile) {
+    failureOf("long", std::string(1 << 20, 'x'));
+    device_->preferences().clear(app);
+    free();
+    device_->preferences().setInOrder(app, "last", "value");
+    EXPECT_THAT(device_->preferences().all(app), ElementsAre(Pair("last", "value")));
+
+    device_->database().sql().exec("PRAGMA max_page_count = 20");
+    failureOf("long", std::string(1 << 20, 'x'));
+    device_->preferences().clearAll();
+    device_.reopen();
+    EXPECT_THAT(device_->preferences().applications(), IsEmpty());
+}
+
+TEST_F(FullDevice, IsGivenNothingMoreAfterMoreThanAnybodyKeepsForIt) {
+    for (int i = 0; i < 5; ++i)
+        EXPECT_EQ(failureOf("long", std::string(1 << 20, 'x')), full_);
+    free();
+    EXPECT_EQ(failureOf("short", "value"), full_);
+    EXPECT_THAT(device_->preferences().all(app), IsEmpty());
+}
+
+TEST(Preferences, ThatAnotherProcessKeptFromBeingWrittenAreWrittenLater) {
+    TemporaryDevice device;
+    SQLite::Database other(device.root() / "device.db", SQLite::OPEN_READWRITE);
+    sqlite3_busy_timeout(device->database().sql().getHandle(), 0);
+    other.exec("BEGIN IMMEDIATE");
+    EXPECT_EQ(messageOf([&] { device->preferences().setInOrder(app, "kept", "value"); }),
+              device.root().string() +
+                  "/device.db: is held by another process (database is locked); end that process and try again");
+    other.exec("COMMIT");
+    device->preferences().setInOrder(app, "last", "value");
+    EXPECT_THAT(device->preferences().all(app), ElementsAre(Pair("kept", "value"), Pair("last", "value")));
 }
 
 }  // namespace

@@ -6,7 +6,7 @@ int preference_set_string(const char* key, const char* value) {
     return service::callOnDevice("preference_set_string", [&](device::Device& device) -> int {
         if (!key || !value)
             return PREFERENCE_ERROR_INVALID_PARAMETER;
-        device.preferences().setUnlessOneFailed(device.application().id, key, value);
+        device.preferences().setInOrder(device.application().id, key, value);
         return PREFERENCE_ERROR_NONE;
     });
 }

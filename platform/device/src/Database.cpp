@@ -8,6 +8,7 @@
 #include "device/Keys.h"
 
 #include <fcntl.h>
+#include <sqlite3.h>
 #include <tuple>
 
 namespace device {
@@ -55,10 +56,23 @@ void refuseWhatIsNoFile(const std::filesystem::path& file) {
         throw Error(file.string() + ": is not a file; move it away, and the device begins with a fresh database");
 }
 
+/// SQLite would let everybody read it, and gives its other files the mode of this one.
+void makePrivate(const std::filesystem::path& file) {
+    Descriptor(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0600));
+}
+
 }  // namespace
 
 Database::Query::~Query() {
     std::ignore = statement_.tryReset();
+}
+
+Database::Impatience::Impatience(Database& database) : database_(database) {
+    sqlite3_busy_timeout(database_.sql().getHandle(), 0);
+}
+
+Database::Impatience::~Impatience() {
+    sqlite3_busy_timeout(database_.sql().getHandle(), busyTimeoutInMilliseconds);
 }
 
 Database::Database(const Folder& folder, Check check)
@@ -69,6 +83,7 @@ Database::Database(const Folder& folder, Check check)
     const bool thorough = check == Check::Full || std::filesystem::exists(suspicion_, ignored);
     std::string damage;
     try {
+        makePrivate(file_);
         sql_ = std::make_unique<SQLite::Database>(file_.string(), SQLite::OPEN_READWRITE | SQLite::OPEN_CREATE,
                                                   busyTimeoutInMilliseconds);
         damage = damageOf(*sql_, file_, thorough);

@@ -2,7 +2,14 @@
 
 #include "device/Database.h"
 
+#include <utility>
+
 namespace device {
+namespace {
+
+constexpr std::size_t mostWaitingBytes = std::size_t{4} << 20;
+
+}  // namespace
 
 std::optional<std::string> Preferences::get(const std::string& appId, const std::string& key) const {
     return database_.guarded([&]() -> std::optional<std::string> {
@@ -23,22 +30,62 @@ void Preferences::set(const std::string& appId, const std::string& key, const st
     });
 }
 
-void Preferences::setUnlessOneFailed(const std::string& appId, const std::string& key, const std::string& value) {
+void Preferences::setInOrder(const std::string& appId, const std::string& key, const std::string& value) {
     if (failure_)
         throw Error(*failure_);
     try {
+        writeWaiting();
         set(appId, key, value);
     } catch (const Error& failure) {
-        failure_ = failure;
+        keepWaiting({appId, key, value});
+        if (waitingBytes_ > mostWaitingBytes) {
+            failure_ = failure;
+            forgetWaiting([](const Write&) { return true; });
+        }
         throw;
     }
 }
 
+void Preferences::writeWaiting() {
+    if (waiting_.empty())
+        return;
+    const Database::Impatience impatience(database_);
+    while (!waiting_.empty()) {
+        const Write& first = waiting_.front();
+        set(first.appId, first.key, first.value);
+        waitingBytes_ -= first.size();
+        waiting_.pop_front();
+    }
+}
+
+void Preferences::keepWaiting(Write write) {
+    waitingBytes_ += write.size();
+    waiting_.push_back(std::move(write));
+}
+
+void Preferences::forgetWaiting(const std::function<bool(const Write&)>& which) {
+    std::erase_if(waiting_, [&](const Write& write) {
+        const bool forgotten = which(write);
+        waitingBytes_ -= forgotten ? write.size() : 0;
+        return forgotten;
+    });
+}
+
+Preferences::~Preferences() {
+    try {
+        writeWaiting();
+    } catch (const std::exception&) {
+        // It was said when it failed for the first time.
+    }
+}
+
 void Preferences::clear(const std::string& appId) {
+    forgetWaiting([&](const Write& write) { return write.appId == appId; });
     database_.guarded([&] { database_.query("DELETE FROM preference WHERE app_id = ?", appId)->exec(); });
 }
 
 void Preferences::clearAll() {
+    forgetWaiting([](const Write&) { return true; });
     database_.guarded([&] { database_.query("DELETE FROM preference")->exec(); });
 }
 

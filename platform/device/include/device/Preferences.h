@@ -2,6 +2,9 @@
 
 #include "device/Error.h"
 
+#include <cstddef>
+#include <deque>
+#include <functional>
 #include <map>
 #include <optional>
 #include <string>
@@ -15,12 +18,16 @@ class Database;
 class Preferences {
 public:
     explicit Preferences(Database& database) : database_(database) {}
+    ~Preferences();
+    Preferences(const Preferences&) = delete;
+    Preferences& operator=(const Preferences&) = delete;
 
     std::optional<std::string> get(const std::string& appId, const std::string& key) const;
     void set(const std::string& appId, const std::string& key, const std::string& value);
-    /// For an application, whose values belong together: as set(), until a write has failed, and from then on that
-    /// failure again. A full disk would else keep the short values and lose the long ones.
-    void setUnlessOneFailed(const std::string& appId, const std::string& key, const std::string& value);
+    /// For an application, whose values belong together: as set(), but nothing overtakes a write that failed. It is
+    /// tried again with the next one, without waiting for other processes, and when this is destroyed. A full disk
+    /// would else keep the short values and lose the long ones. After 4 MiB of failed writes nothing is written more.
+    void setInOrder(const std::string& appId, const std::string& key, const std::string& value);
     void clear(const std::string& appId);
     /// What a customisation reset does: every application starts anew.
     void clearAll();
@@ -29,7 +36,21 @@ public:
     std::vector<std::string> applications() const;
 
 private:
+    struct Write {
+        std::string appId;
+        std::string key;
+        std::string value;
+        std::size_t size() const { return appId.size() + key.size() + value.size(); }
+    };
+
+    void writeWaiting();
+    void keepWaiting(Write write);
+    void forgetWaiting(const std::function<bool(const Write&)>& which);
+
     Database& database_;
+    std::deque<Write> waiting_;
+    std::size_t waitingBytes_ = 0;
+    /// Set once more had failed than is kept.
     std::optional<Error> failure_;
 };
 
