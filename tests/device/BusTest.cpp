@@ -62,6 +62,29 @@ TEST(Bus, IsMissingWithoutNoiseForEveryAddressThatLeadsNowhere) {
     }
 }
 
+TEST(Bus, IsMissingWithoutNoiseWhereItTakesOtherUsersOnly) {
+    const PrivateBus refusing(true, "ANONYMOUS");
+    const TemporaryFolder folder;
+    EXPECT_EQ(connectSilently(Folder(folder.path())), nullptr);
+}
+
+TEST(Bus, IsMissingWithoutNoiseWhereAnotherBusHasTakenItsPlace) {
+    const PrivateBus daemon;
+    const std::string place = daemon.address().substr(0, daemon.address().find(','));
+    const Environment session("DBUS_SESSION_BUS_ADDRESS", place + ",guid=0123456789abcdef0123456789abcdef");
+    const TemporaryFolder folder;
+    EXPECT_EQ(connectSilently(Folder(folder.path())), nullptr);
+}
+
+TEST(Bus, IsThePrivateOneThatTheFolderNamesAlsoWhereThereIsASessionBus) {
+    const PrivateBus own(false);
+    const PrivateBus session;
+    const TemporaryFolder folder;
+    EXPECT_FALSE(connectSilently(Folder(folder.path()))->isPrivate());
+    writeFile(folder.path() / "bus.address", own.address() + "\n");
+    EXPECT_TRUE(connectSilently(Folder(folder.path()))->isPrivate());
+}
+
 TEST(Bus, IsMissingAfterAShortTimeWhereItsDaemonIsStopped) {
     const PrivateBus daemon;
     daemon.stop();

@@ -35,7 +35,7 @@ constexpr double answerTimeoutInMilliseconds = 5000;
 }  // namespace
 
 struct Bus::Link {
-    Link(const Folder& device, std::string at);
+    Link(const Folder& device, BusAddress at);
     ~Link();
     Link(const Link&) = delete;
     Link& operator=(const Link&) = delete;
@@ -47,7 +47,7 @@ struct Bus::Link {
     unsigned callOfBus(const char* method, const std::string& name, const unsigned* flags) const;
 
     Folder folder;
-    std::string address;
+    BusAddress address;
     Eldbus_Connection* connection = nullptr;
     Eldbus_Object* busObject = nullptr;
     Eldbus_Proxy* busProxy = nullptr;
@@ -58,8 +58,8 @@ struct Bus::Link {
     bool alive = true;
 };
 
-Bus::Link::Link(const Folder& device, std::string at)
-    : folder(device), address(std::move(at)), connection(eldbus_private_address_connection_get(address.c_str())) {
+Bus::Link::Link(const Folder& device, BusAddress at)
+    : folder(device), address(std::move(at)), connection(eldbus_private_address_connection_get(address.text.c_str())) {
     if (!connection)
         return;
     eldbus_connection_event_callback_add(connection, ELDBUS_CONNECTION_EVENT_DISCONNECTED, whenDisconnected, this);
@@ -127,13 +127,13 @@ unsigned Bus::Link::callOfBus(const char* method, const std::string& name, const
     if (answer)
         eldbus_message_unref(answer);
     if (!understood)
-        throw Error("the device's bus does not answer at " + address + "; start the device anew");
+        throw Error("the device's bus does not answer at " + address.text + "; start the device anew");
     return result;
 }
 
 std::unique_ptr<Bus> Bus::connect(const Folder& folder) {
-    for (const std::string& address : busAddresses(folder)) {
-        if (!answers(address))
+    for (const BusAddress& address : busAddresses(folder)) {
+        if (!answers(address.text))
             continue;
         startEldbus();
         auto link = std::make_unique<Link>(folder, address);
@@ -155,6 +155,10 @@ const Folder& Bus::folder() const {
     return link_->folder;
 }
 
+bool Bus::isPrivate() const {
+    return link_->address.isPrivate;
+}
+
 bool Bus::isAlive() const {
     return link_->alive;
 }
@@ -172,7 +176,7 @@ BlockingConnection& Bus::blocking() const {
     if (!link_->alive)
         throw Error("the device's bus has gone; start the device anew");
     if (!link_->blocking)
-        link_->blocking = std::make_unique<BlockingConnection>(link_->address);
+        link_->blocking = std::make_unique<BlockingConnection>(link_->address.text);
     const auto timeout = std::chrono::milliseconds(static_cast<int>(answerTimeoutInMilliseconds));
     // Asked first on the connection that can say no in peace, then on the other, behind all that it has sent.
     link_->blocking->answerTo(BlockingConnection::callOfBus("GetId"), timeout);

@@ -21,6 +21,7 @@ namespace device {
 namespace {
 
 constexpr std::chrono::milliseconds patience{2000};
+constexpr std::size_t longestAnswer = 1024;
 
 using Entries = std::unique_ptr<DBusAddressEntry*, decltype(&dbus_address_entries_free)>;
 
@@ -76,12 +77,14 @@ std::string greeting() {
     return line + "\r\n";
 }
 
-bool answersGreeting(const Descriptor& socket) {
+/// The bus's answer to the greeting, without its end; empty when none comes in time.
+std::string answerToGreeting(const Descriptor& socket) {
     const std::string line = greeting();
+    std::string answer;
     if (send(socket.get(), line.data(), line.size(), MSG_NOSIGNAL) != static_cast<ssize_t>(line.size()))
-        return false;
+        return answer;
     const auto end = std::chrono::steady_clock::now() + patience;
-    for (;;) {
+    while (answer.size() < longestAnswer && !answer.ends_with("\r\n")) {
         const auto left =
             std::chrono::duration_cast<std::chrono::milliseconds>(end - std::chrono::steady_clock::now()).count();
         pollfd wait{socket.get(), POLLIN, 0};
@@ -89,31 +92,41 @@ bool answersGreeting(const Descriptor& socket) {
         if (ready < 0 && errno == EINTR)
             continue;
         char byte = 0;
-        return ready == 1 && recv(socket.get(), &byte, 1, 0) == 1;
+        if (ready != 1 || recv(socket.get(), &byte, 1, 0) != 1)
+            return {};
+        answer += byte;
     }
+    return answer;
+}
+
+/// Whether the bus of the address is there: one that refuses this user, or another bus in its place, is not.
+bool isThere(DBusAddressEntry* entry) {
+    const Descriptor socket = connectedTo(socketName(entry));
+    const std::string answer = socket ? answerToGreeting(socket) : "";
+    const char* id = dbus_address_entry_get_value(entry, "guid");
+    return id ? answer == "OK " + std::string(id) + "\r\n" : answer.starts_with("OK ");
 }
 
 }  // namespace
 
-std::vector<std::string> busAddresses(const Folder& folder) {
-    std::vector<std::string> addresses;
-    if (const char* session = std::getenv("DBUS_SESSION_BUS_ADDRESS"))
-        addresses.emplace_back(session);
+std::vector<BusAddress> busAddresses(const Folder& folder) {
+    std::vector<BusAddress> addresses;
     std::error_code error;
     if (std::filesystem::is_regular_file(folder.busAddress(), error)) {
         std::ifstream file(folder.busAddress());
         std::string line;
         std::getline(file, line);
-        addresses.push_back(line);
+        addresses.push_back({line, true});
     }
+    if (const char* session = std::getenv("DBUS_SESSION_BUS_ADDRESS"))
+        addresses.push_back({session, false});
     return addresses;
 }
 
 bool answers(const std::string& text) {
     const Address address = parsed(text);
     for (int entry = 0; entry < address.count; ++entry) {
-        const Descriptor socket = connectedTo(socketName(address.entries.get()[entry]));
-        if (socket && answersGreeting(socket))
+        if (isThere(address.entries.get()[entry]))
             return true;
     }
     return false;

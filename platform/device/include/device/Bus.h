@@ -24,8 +24,8 @@ inline constexpr char screenInterface[] = "com.ravella.device.Screen";
 std::string pathOf(const std::string& appId);
 }  // namespace bus
 
-/// This process's connection to the device's bus: the session bus where there is one, else the private bus that
-/// the device's folder names. Owns the connection; ends it when destroyed.
+/// This process's connection to the device's bus: the private one that the device's folder names, where it runs, else
+/// the session bus. Owns the connection; ends it when destroyed.
 class Bus {
     struct Link;
 
@@ -41,6 +41,9 @@ public:
     /// For what is served and sent; its answers come through the main loop.
     Eldbus_Connection* connection() const;
     const Folder& folder() const;
+
+    /// Whether it is the device's private bus, not the session bus.
+    bool isPrivate() const;
 
     /// False once the bus has gone. Nothing that waits for an answer may be sent on connection() then: libdbus
     /// ends a process that does.
