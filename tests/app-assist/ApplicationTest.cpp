@@ -1,4 +1,5 @@
 #include "TellingApp.h"
+#include "Toolkit.h"
 
 #include "support/Environment.h"
 #include "support/TemporaryDevice.h"
@@ -169,8 +170,23 @@ TEST_F(Application, HasTheProfileAndTheScaleOfTheDevicesDisplay) {
         EXPECT_DOUBLE_EQ(2.6, elm_config_scale_get());
     }
     set(device::keys::screen, "480x800");
+    device_.reopen();
     RunningApp running(app_);
     EXPECT_DOUBLE_EQ(1.7, elm_config_scale_get());
+}
+
+TEST_F(Application, HasTheToolkitsErrorsInTheDevicesLog) {
+    char name[] = "app";
+    char* argv[] = {name, nullptr};
+    const app_assist::Toolkit toolkit(*device_.operator->(), app_assist::Toolkit::Messages::InLog, 1, argv);
+    EINA_LOG_CRIT("a widget is broken");
+    EINA_LOG_ERR("a widget complains of %d things", 2);
+    EINA_LOG_WARN("a widget is worried");
+    const std::string log = support::readFile(device_->folder().log());
+    EXPECT_THAT(log, testing::ContainsRegex(" E EFL\\([0-9]+\\) : TestBody\\([0-9]+\\) > a widget is broken\n"));
+    EXPECT_THAT(log,
+                testing::ContainsRegex(" W EFL\\([0-9]+\\) : TestBody\\([0-9]+\\) > a widget complains of 2 things\n"));
+    EXPECT_THAT(log, testing::Not(testing::HasSubstr("worried")));
 }
 
 TEST_F(Application, FindsItsOwnTextsAndTheDevices) {

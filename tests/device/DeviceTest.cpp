@@ -45,17 +45,26 @@ TEST(Device, ListsTheLanguagesOfItsOwnTexts) {
 }
 
 TEST(Device, HasTheScreenOfItsSetting) {
-    const TemporaryDevice device;
+    TemporaryDevice device;
     EXPECT_EQ(device->screen().name, "720x1280");
+    EXPECT_EQ(device->screen().scale, 2.6);
+    EXPECT_EQ(device->screen().resourceFolder, "");
     device->settings().set(device::keys::screen, "480x800");
+    device.reopen();
     EXPECT_EQ(device->screen().width, 480);
     EXPECT_EQ(device->screen().height, 800);
     EXPECT_EQ(device->screen().scale, 1.7);
     EXPECT_EQ(device->screen().resourceFolder, "LDPI");
     device->settings().set(device::keys::screen, "nonsense");
+    device.reopen();
     EXPECT_EQ(device->screen().name, "720x1280");
-    EXPECT_EQ(device->screen().scale, 2.6);
-    EXPECT_EQ(device->screen().resourceFolder, "");
+}
+
+TEST(Device, KeepsItsScreenUntilItIsOpenedAnew) {
+    TemporaryDevice device;
+    EXPECT_EQ(device->screen().name, "720x1280");
+    device->settings().set(device::keys::screen, "480x800");
+    EXPECT_EQ(device->screen().name, "720x1280");
 }
 
 TEST(Device, KnowsTheProfilesOfItsKind) {

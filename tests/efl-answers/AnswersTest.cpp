@@ -152,9 +152,12 @@ TEST_F(EflAnswersForVetoes, AnItemThatKeptItselfGoesWhenItIsAskedAgain) {
 
 TEST_F(EflAnswers, TheScreenIsTheDevicesWhateverShowsIt) {
     EXPECT_EQ((Rect{0, 0, 720, 1280}), screenSize());
+    elm_win_screen_size_get(window(), nullptr, nullptr, nullptr, nullptr);
+}
+
+TEST_F(EflAnswers, TheScreenIsTheSmallOneOnADeviceThatHasThat) {
     device_->settings().set(device::keys::screen, "480x800");
     EXPECT_EQ((Rect{0, 0, 480, 800}), screenSize());
-    elm_win_screen_size_get(window(), nullptr, nullptr, nullptr, nullptr);
 }
 
 TEST_F(EflAnswers, AThemeFileIsAddedOnce) {

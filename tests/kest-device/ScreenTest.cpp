@@ -100,6 +100,18 @@ TEST_F(OnScreen, ALanguageIsOnTheScreenWhenSetComesBack) {
     EXPECT_EQ(waitFor("text=Fruits ko_KR"), done());
 }
 
+TEST_F(OnScreen, ALanguageThatIsUnsetIsFollowedToo) {
+    device_.must({"set", "language", "ko_KR"});
+    EXPECT_EQ(run({"unset", "language"}), done());
+    EXPECT_THAT(device_.must({"tree"}), HasSubstr("Fruits en_US"));
+}
+
+TEST_F(OnScreen, ATreeMayBeLargerThanTheBusTakesAtOnce) {
+    device_.must({"stop"});
+    ASSERT_EQ(start({"mode=talkative"}).status, 0);
+    EXPECT_GT(device_.must({"tree"}).size(), 500000U);
+}
+
 TEST_F(OnScreen, WaitingEndsWhenItIsSo) {
     EXPECT_EQ(waitFor("rows=40"), done());
     EXPECT_EQ(waitFor("text=Pear"), failed("still not text=Pear after 0 seconds"));
@@ -139,6 +151,10 @@ TEST_F(OnScreen, AnApplicationThatHangsIsSaidToDoSo) {
 
     EXPECT_EQ(run({"tree"}), failed("com.example.sample (process " + std::to_string(application) +
                                     ") does not answer; end it with 'kest-device stop'"));
+    EXPECT_EQ(run({"set", "theme", "dark"}),
+              failed("the change is made, but com.example.sample (process " + std::to_string(application) +
+                     ") does not answer, so it may not follow before its next start; end it with 'kest-device stop'"));
+    EXPECT_EQ(run({"get", "theme"}), done("dark\n"));
     EXPECT_EQ(run({"stop"}), done("com.example.sample (process " + std::to_string(application) +
                                   ") did not answer and was ended by force\n"));
     EXPECT_THAT(device_.processes(), IsEmpty());

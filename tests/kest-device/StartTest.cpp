@@ -66,6 +66,36 @@ TEST_F(Start, UsesTheSessionBusWhereThereIsOne) {
     EXPECT_THAT(device_.processes(), IsEmpty());
 }
 
+TEST_F(Start, KeepsToItsPrivateBusWhereASessionBusTurnsUpLater) {
+    ASSERT_EQ(start().status, 0);
+    const support::PrivateBus session;
+    device_.setEnvironment("DBUS_SESSION_BUS_ADDRESS", session.address());
+
+    EXPECT_EQ(device_.json({"status"})["bus"], "private");
+    EXPECT_EQ(run({"set", "language", "ko_KR"}), done());
+    EXPECT_THAT(device_.must({"tree"}), testing::HasSubstr("Fruits ko_KR"));
+    const pid_t application = device_.application();
+    EXPECT_EQ(run({"stop"}), done(named(application) + " ended\n"));
+    EXPECT_THAT(device_.processes(), IsEmpty());
+}
+
+TEST_F(Start, HappensOnceHoweverManyAskForItAtATime) {
+    const auto other = device_.runInBackground({"start", "--headless", "--", sample});
+
+    const Result result = start();
+
+    const pid_t application = device_.application();
+    if (result.status == 0) {
+        EXPECT_EQ(result, done(runs(application)));
+    } else {
+        EXPECT_EQ(result, failed("com.example.sample runs already (process " + std::to_string(application) +
+                                 "); end it with 'kest-device stop' first"));
+        EXPECT_TRUE(other.outBecomes(runs(application)));
+    }
+    EXPECT_EQ(run({"wait-for", "text=Apple", "--timeout", "0"}), done());
+    EXPECT_EQ(run({"stop"}), done(named(application) + " ended\n"));
+}
+
 TEST_F(Start, ASecondDeviceOnOneBusIsRefusedWithTheNameOfTheFirst) {
     const support::PrivateBus session;
     device_.setEnvironment("DBUS_SESSION_BUS_ADDRESS", session.address());

@@ -121,6 +121,14 @@ TEST_F(TipsList, FitsTheSmallScreen) {
     EXPECT_THAT(shown["rows"], SizeIs(menusOfferedIn("Global").size() + 1));
 }
 
+TEST_F(TipsList, FollowsAFinger) {
+    start();
+    const std::string first = titles().front();
+    EXPECT_TRUE(holds("text=" + first));
+    device_.must({"swipe", "360", "1100", "360", "200"});
+    EXPECT_FALSE(holds("text=" + first));
+}
+
 TEST_F(TipsList, ALaterStartOpensTheMainMenuAndNoOtherFileOfTheCatalogue) {
     const auto openedAtAStart = [&](const char* name) {
         const std::filesystem::path trace = device_.folder() / name;

@@ -64,7 +64,9 @@ TEST_F(Program, IsRefusedOnABusThatHasAnotherDevice) {
 
 TEST_F(Program, StartedByHandWithoutABusSaysSoAndRunsOn) {
     const std::filesystem::path out = device_.folder() / "said";
-    const support::Environment folder("KEST_DEVICE", device_.root().string());
+    std::filesystem::create_directories(device_.root());
+    std::filesystem::create_directory_symlink(device_.root(), device_.folder() / "link");
+    const support::Environment folder("KEST_DEVICE", (device_.folder() / "link/").string());
     const support::Environment home("HOME", device_.folder().string());
     const support::Environment engine("ELM_ENGINE", "buffer");
     const support::Environment bus("DBUS_SESSION_BUS_ADDRESS", std::nullopt);
@@ -76,13 +78,15 @@ TEST_F(Program, StartedByHandWithoutABusSaysSoAndRunsOn) {
         return 127;
     });
 
-    // The tool finds it by its environment, though no bus leads to it.
+    // The tool finds it, though no bus leads to it and its environment names the folder in another way.
     while (device_.json({"status"})["applications"].empty() || support::readFile(out).empty()) {
         poll(nullptr, 0, 20);
     }
     EXPECT_EQ(support::readFile(out), "kest: there is no bus: remote control is off\n");
     EXPECT_EQ(device_.run({"tap", "1", "1"}), failed("com.ravella.kest (process " + std::to_string(program.id()) +
                                                      ") does not answer; end it with 'kest-device stop'"));
+    EXPECT_EQ(device_.run({"reset"}),
+              failed("com.ravella.kest runs on this device; end it with 'kest-device stop' first"));
     program.end(SIGTERM);
 }
 

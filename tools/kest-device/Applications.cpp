@@ -1,5 +1,6 @@
 #include "Applications.h"
 
+#include "device/ApplicationLock.h"
 #include "device/BusName.h"
 #include "device/Error.h"
 
@@ -10,12 +11,11 @@ namespace tool {
 
 namespace {
 
-namespace fs = std::filesystem;
 using namespace std::chrono_literals;
 
 constexpr auto patience = 3s;
 
-/// Which device the application belongs to; empty when it does not say.
+/// Which device the application belongs to; empty when it does not answer.
 std::string folderOf(const device::Bus& bus, const std::string& id) {
     try {
         return device::BusCall(bus, id, device::bus::pathOf(id), device::bus::applicationInterface, patience)
@@ -37,6 +37,7 @@ std::set<std::string> knownIds(device::Device& device) {
     return ids;
 }
 
+/// Those that answer on the bus and belong to this device.
 void addThoseOnBus(Session& session, std::vector<RunningApplication>& running) {
     const device::Bus* bus = session.bus();
     if (!bus) {
@@ -45,39 +46,25 @@ void addThoseOnBus(Session& session, std::vector<RunningApplication>& running) {
     const std::string ours = session.folder().root();
     const std::set<std::string> known = knownIds(session.device());
     for (const std::string& name : device::BusName::all(*bus)) {
-        if (!known.contains(name)) {
+        if (!known.contains(name) || folderOf(*bus, name) != ours) {
             continue;
         }
-        const std::optional<int> id = device::BusName::processOf(*bus, name);
-        const std::string folder = folderOf(*bus, name);
-        if (id && (folder == ours || (folder.empty() && Process(*id).environment("KEST_DEVICE") == ours))) {
-            running.push_back({name, Process(*id), !folder.empty()});
+        if (const std::optional<int> id = device::BusName::processOf(*bus, name)) {
+            running.push_back({name, Process(*id), true});
         }
     }
 }
 
-/// The package whose program the process runs; nullopt when it runs none of this device's.
-std::optional<std::string> packageOf(device::Device& device, const Process& process) {
-    const fs::path executable = process.executable();
-    for (const device::Package& package : device.packages().all()) {
-        std::error_code error;
-        if (!package.exec.empty() && fs::weakly_canonical(package.exec, error) == executable) {
-            return package.id;
-        }
-    }
-    return std::nullopt;
-}
-
-void addThoseWithoutBus(Session& session, std::vector<RunningApplication>& running) {
-    for (const Process& process : Process::withEnvironment("KEST_DEVICE", session.folder().root())) {
-        const bool known = std::any_of(running.begin(), running.end(), [&](const RunningApplication& application) {
-            return application.process.id() == process.id();
-        });
-        if (known || !process.runs()) {
+/// The others: those that run without the bus, and those that hang.
+void addThoseThatDoNotAnswer(Session& session, std::vector<RunningApplication>& running) {
+    for (const std::string& id : knownIds(session.device())) {
+        const bool answers = std::any_of(running.begin(), running.end(),
+                                         [&](const RunningApplication& application) { return application.id == id; });
+        if (answers) {
             continue;
         }
-        if (const std::optional<std::string> id = packageOf(session.device(), process)) {
-            running.push_back({*id, process, false});
+        if (const std::optional<pid_t> process = device::ApplicationLock::holder(session.folder(), id)) {
+            running.push_back({id, Process(*process), false});
         }
     }
 }
@@ -89,10 +76,14 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
 
 }  // namespace
 
+std::string nameOf(const RunningApplication& application) {
+    return application.id + " (process " + std::to_string(application.process.id()) + ")";
+}
+
 std::vector<RunningApplication> runningApplications(Session& session) {
     std::vector<RunningApplication> running;
     addThoseOnBus(session, running);
-    addThoseWithoutBus(session, running);
+    addThoseThatDoNotAnswer(session, running);
     std::stable_sort(running.begin(), running.end(), [](const auto& a, const auto& b) { return a.id < b.id; });
     return running;
 }
@@ -131,8 +122,7 @@ RunningApplication theApplication(Session& session, const std::string& id) {
         throw device::Error("several applications run on this device (" + ids + "); name one with --app");
     }
     if (!meant.front().onBus) {
-        throw device::Error(meant.front().id + " (process " + std::to_string(meant.front().process.id()) +
-                            ") does not answer; end it with 'kest-device stop'");
+        throw device::Error(nameOf(meant.front()) + " does not answer; end it with 'kest-device stop'");
     }
     return meant.front();
 }
@@ -146,10 +136,18 @@ device::BusCall callTo(Session& session, const std::string& id, const char* inte
 }
 
 void settle(Session& session) {
+    std::string deaf;
     for (const RunningApplication& application : runningApplications(session)) {
         if (application.onBus) {
             callTo(session, application.id).call("Settle");
+        } else {
+            deaf += (deaf.empty() ? "" : ", ") + nameOf(application);
         }
+    }
+    if (!deaf.empty()) {
+        throw device::Error("the change is made, but " + deaf +
+                            " does not answer, so it may not follow before its next start; end it with "
+                            "'kest-device stop'");
     }
 }
 

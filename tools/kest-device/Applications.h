@@ -17,6 +17,9 @@ struct RunningApplication {
     bool onBus = true;  ///< false: it runs without a bus, or does not answer on it
 };
 
+/// How people are told of it: "com.example.sample (process 4711)".
+std::string nameOf(const RunningApplication& application);
+
 /// Those of the session's device, in the order of their ids.
 std::vector<RunningApplication> runningApplications(Session& session);
 
@@ -30,8 +33,8 @@ RunningApplication theApplication(Session& session, const std::string& id);
 /// Calls one of the application's interfaces, com.ravella.device.Screen unless said otherwise.
 device::BusCall callTo(Session& session, const std::string& id, const char* interface = device::bus::screenInterface);
 
-/// Returns when the screens of all running applications have settled. Applications that do not answer are
-/// waited for no longer than their calls take.
+/// Returns when the screens of all running applications have settled after a change.
+/// Throws device::Error that names those that do not answer, which may not have heard of it.
 void settle(Session& session);
 
 }  // namespace tool

@@ -84,22 +84,6 @@ public:
 
 }  // namespace
 
-std::vector<Process> Process::withEnvironment(const std::string& variable, const std::string& value) {
-    std::vector<Process> found;
-    std::error_code error;
-    for (fs::directory_iterator entry("/proc", error), end; !error && entry != end; entry.increment(error)) {
-        const std::string name = entry->path().filename();
-        if (name.find_first_not_of("0123456789") != std::string::npos) {
-            continue;
-        }
-        const Process process(std::stoi(name));
-        if (process.id() != getpid() && process.environment(variable) == value) {
-            found.push_back(process);
-        }
-    }
-    return found;
-}
-
 bool Process::runs() const {
     std::ifstream stream(procFolder(id_) / "stat");
     std::string stat{std::istreambuf_iterator<char>(stream), {}};

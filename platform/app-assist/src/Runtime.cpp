@@ -58,6 +58,8 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
     }
     try {
         device_ = &device::Device::current();
+        if (const auto status = claimInstance())
+            return status;
         requireDisplay();
         startToolkit(argc, argv);
         if (!createApplication(argc, argv)) {
@@ -65,8 +67,6 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
             return 1;
         }
         if (const auto status = joinBus())
-            return status;
-        if (const auto status = claimInstance())
             return status;
         queueFirstRequest();
         return std::nullopt;
@@ -126,7 +126,7 @@ std::optional<int> Runtime::joinBus() {
 }
 
 std::optional<int> Runtime::claimInstance() {
-    instance_.emplace(*device_);
+    instance_.emplace(device_->folder(), device_->application().id);
     return instance_->isHeld() ? std::nullopt : std::optional(sayRunning());
 }
 

@@ -2,11 +2,11 @@
 
 #include "BusPresence.h"
 #include "DisplayWindow.h"
-#include "InstanceLock.h"
 #include "LaunchRequest.h"
 #include "Toolkit.h"
 
 #include <app-assist/WApp.h>
+#include <device/ApplicationLock.h>
 #include <device/Device.h>
 
 #include <optional>
@@ -49,7 +49,7 @@ private:
     std::optional<Toolkit> toolkit_;
     std::optional<PreinitializedWindow> windowAhead_;
     std::optional<BusPresence> presence_;
-    std::optional<InstanceLock> instance_;
+    std::optional<device::ApplicationLock> instance_;
     device::Events::Subscription settings_;
     LaunchRequest::Extras extras_;
     Ecore_Idle_Enterer* firstRequest_ = nullptr;

@@ -58,7 +58,9 @@ void Device::setCurrent(std::unique_ptr<Device> device) {
 }
 
 const Screen& Device::screen() const {
-    return Screen::named(settings_.get(keys::screen).value_or(keys::defaultScreen));
+    if (!screen_)
+        screen_ = &Screen::named(settings_.get(keys::screen).value_or(keys::defaultScreen));
+    return *screen_;
 }
 
 std::string Device::language() const {

@@ -12,8 +12,22 @@ std::string fruit(long index) {
     return index == 0 ? "Apple" : "Fruit " + std::to_string(index);
 }
 
+/// More than a row, and all rows together than a bus, can take.
+std::string praise() {
+    std::string praise;
+    for (int i = 0; i < 2000; ++i) {
+        praise += " is very good";
+    }
+    return praise;
+}
+
 char* textOf(void* data, Evas_Object*, const char* part) {
     return std::strcmp(part, "elm.text") == 0 ? strdup(fruit(reinterpret_cast<long>(data)).c_str()) : nullptr;
+}
+
+char* longTextOf(void* data, Evas_Object*, const char* part) {
+    const std::string text = fruit(reinterpret_cast<long>(data)) + praise();
+    return std::strcmp(part, "elm.text") == 0 ? strdup(text.c_str()) : nullptr;
 }
 
 void fillWindow(Evas_Object* window, Evas_Object* object) {
@@ -24,8 +38,8 @@ void fillWindow(Evas_Object* window, Evas_Object* object) {
 
 }  // namespace
 
-SampleWindow::SampleWindow(Evas_Object* window, std::string title)
-    : stack_(elm_naviframe_add(window)), list_(elm_genlist_add(stack_)) {
+SampleWindow::SampleWindow(Evas_Object* window, const std::string& title, bool talkative)
+    : talkative_(talkative), stack_(elm_naviframe_add(window)), list_(elm_genlist_add(stack_)) {
     Evas_Object* background = elm_bg_add(window);
     fillWindow(window, background);
     fillWindow(window, stack_);
@@ -41,7 +55,7 @@ void SampleWindow::setTitle(const std::string& title) const {
 void SampleWindow::fillList() {
     Elm_Genlist_Item_Class* row = elm_genlist_item_class_new();
     row->item_style = "default";
-    row->func.text_get = textOf;
+    row->func.text_get = talkative_ ? longTextOf : textOf;
     for (long i = 0; i < rowCount; ++i) {
         elm_genlist_item_append(list_, row, reinterpret_cast<void*>(i), nullptr, ELM_GENLIST_ITEM_NONE, onChosen, this);
     }

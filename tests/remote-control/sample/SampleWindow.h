@@ -12,7 +12,8 @@ namespace sample {
 class SampleWindow {
 public:
     /// `window` is an existing window; it takes everything over.
-    SampleWindow(Evas_Object* window, std::string title);
+    /// A talkative one has rows with long texts.
+    SampleWindow(Evas_Object* window, const std::string& title, bool talkative = false);
 
     Evas_Object* stack() const { return stack_; }
     Evas_Object* list() const { return list_; }
@@ -25,6 +26,7 @@ private:
     static void onChosen(void* data, Evas_Object* list, void* item);
     void fillList();
 
+    bool talkative_;
     Evas_Object* stack_;
     Evas_Object* list_;
     Elm_Object_Item* page_ = nullptr;

@@ -1,5 +1,6 @@
 #include "SampleWindow.h"
 
+#include "device/ApplicationLock.h"
 #include "device/Bus.h"
 #include "device/BusName.h"
 #include "device/Device.h"
@@ -41,6 +42,7 @@ int run(const std::string& mode) {
         std::abort();
     }
     device::Device& device = device::Device::current();
+    const device::ApplicationLock lock(device.folder(), device.application().id);
     Evas_Object* window = elm_win_add(nullptr, "sample", ELM_WIN_BASIC);
     if (!window) {
         throw std::runtime_error("no window");
@@ -48,7 +50,7 @@ int run(const std::string& mode) {
     elm_win_title_set(window, "Sample");
     elm_win_autodel_set(window, EINA_TRUE);
     elm_policy_set(ELM_POLICY_QUIT, ELM_POLICY_QUIT_LAST_WINDOW_CLOSED);
-    sample::SampleWindow screen(window, titleFor(device));
+    sample::SampleWindow screen(window, titleFor(device), mode == "talkative");
     evas_object_resize(window, device.screen().width, device.screen().height);
     evas_object_show(window);
 

@@ -1,7 +1,6 @@
 #include "Applications.h"
 #include "Commands.h"
 #include "Output.h"
-#include "PrivateBus.h"
 #include "device/Keys.h"
 
 namespace tool {
@@ -34,8 +33,8 @@ State stateOf(Session& session) {
     state.country = device.settings().get(device::keys::country).value_or("");
     state.theme = device.isDark() ? "dark" : "light";
     state.screen = device.screen().name;
-    if (session.bus()) {
-        state.bus = PrivateBus(session.folder()).process() ? "private" : "session";
+    if (const device::Bus* bus = session.bus()) {
+        state.bus = bus->isPrivate() ? "private" : "session";
     }
     state.running = runningApplications(session);
     return state;
@@ -45,8 +44,7 @@ void printForPeople(const State& state) {
     std::vector<std::vector<std::string>> rows{{"folder", state.folder}};
     rows.push_back({"bus", state.bus.empty() ? "none" : state.bus});
     for (const RunningApplication& application : state.running) {
-        rows.push_back({"running", application.id + " (process " + std::to_string(application.process.id()) + ")" +
-                                       (application.onBus ? "" : ", does not answer")});
+        rows.push_back({"running", nameOf(application) + (application.onBus ? "" : ", does not answer")});
     }
     if (state.running.empty()) {
         rows.push_back({"running", "nothing"});

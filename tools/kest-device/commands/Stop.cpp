@@ -22,7 +22,7 @@ Example:
   kest-device stop)";
 
 void endApplication(Session& session, const RunningApplication& application) {
-    const std::string name = application.id + " (process " + std::to_string(application.process.id()) + ")";
+    const std::string name = nameOf(application);
     bool asked = false;
     if (application.onBus) {
         try {

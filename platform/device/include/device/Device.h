@@ -54,7 +54,8 @@ public:
     Usage& usage() { return usage_; }
     Log& log() { return log_; }
 
-    /// The display, by the setting keys::screen.
+    /// The display, by the setting keys::screen as it was when this was first asked for: a window cannot change its
+    /// display, so a change of the setting counts from the next start on.
     const Screen& screen() const;
     /// The display language without its codeset ("ko_KR").
     std::string language() const;
@@ -77,6 +78,7 @@ private:
     Usage usage_;
     Log log_;
     std::unique_ptr<Application> application_;
+    mutable const Screen* screen_ = nullptr;
 };
 
 }  // namespace device

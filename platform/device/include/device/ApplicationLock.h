@@ -1,0 +1,32 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <sys/types.h>
+
+namespace device {
+
+class Folder;
+
+/// Keeps an application to one process a device, also where there is no bus to tell of the first: two would write
+/// each other's preferences over. Held until it is destroyed or the process ends, however it ends.
+class ApplicationLock {
+public:
+    /// Takes the application's lock, unless another process has it. Throws Error when its file cannot be made.
+    ApplicationLock(const Folder& folder, const std::string& appId);
+    ~ApplicationLock();
+    ApplicationLock(const ApplicationLock&) = delete;
+    ApplicationLock& operator=(const ApplicationLock&) = delete;
+
+    bool isHeld() const { return held_; }
+
+    /// The other process that has the lock: the one that is the application; nullopt when none is.
+    /// Not for a process that has the lock itself, which would lose it.
+    static std::optional<pid_t> holder(const Folder& folder, const std::string& appId);
+
+private:
+    int descriptor_;
+    bool held_;
+};
+
+}  // namespace device

@@ -1,0 +1,51 @@
+#include "device/ApplicationLock.h"
+
+#include "Files.h"
+#include "device/Error.h"
+#include "device/Folder.h"
+
+#include <cerrno>
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace device {
+namespace {
+
+int openLockFile(const std::filesystem::path& file) {
+    const int descriptor = open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600);
+    if (descriptor < 0)
+        throw Error(file.string() + ": " + reasonOf(errno) + "; make the device's folder writable");
+    return descriptor;
+}
+
+/// Of the whole file. A lock of this kind tells who has it, and no child process inherits it.
+struct flock wholeFile() {
+    struct flock lock {};
+    lock.l_type = F_WRLCK;
+    lock.l_whence = SEEK_SET;
+    return lock;
+}
+
+bool take(int descriptor) {
+    struct flock lock = wholeFile();
+    return fcntl(descriptor, F_SETLK, &lock) == 0;
+}
+
+}  // namespace
+
+ApplicationLock::ApplicationLock(const Folder& folder, const std::string& appId)
+    : descriptor_(openLockFile(folder.applicationLock(appId))), held_(take(descriptor_)) {}
+
+ApplicationLock::~ApplicationLock() {
+    close(descriptor_);
+}
+
+std::optional<pid_t> ApplicationLock::holder(const Folder& folder, const std::string& appId) {
+    const Descriptor file(open(folder.applicationLock(appId).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOFOLLOW));
+    struct flock lock = wholeFile();
+    if (!file || fcntl(file.get(), F_GETLK, &lock) != 0 || lock.l_type == F_UNLCK)
+        return std::nullopt;
+    return lock.l_pid;
+}
+
+}  // namespace device
