@@ -2,6 +2,7 @@
 
 #include "KestContentInfo.h"
 
+#include <cstdint>
 #include <string>
 
 /// The catalogue's cache in the application's preferences: what it is valid for, and nine fields of every record
@@ -12,6 +13,10 @@ public:
     static void save(const KestContentInfo& record);
     /// Puts the fields cached for `path` into `record`; one that is absent or empty leaves the record's as it is.
     static void load(const std::string& path, KestContentInfo& record);
+    /// How many bytes the record's cached fields have.
+    static std::uint64_t sizeOf(const KestContentInfo& record);
+    /// Empties them.
+    static void clear(KestContentInfo& record);
 
     /// Display language and package version that the cache was built for. False when the key cannot be read.
     static bool readLanguage(std::string& language);

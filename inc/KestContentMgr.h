@@ -38,6 +38,8 @@ private:
     bool __loadMainMenu();
     bool __loadDetailMenu(KestContentInfo& record);
     void __readDetail(xmlNode* node, KestContentInfo& record);
+    /// Leaves the record without its texts where the load keeps too many already.
+    void __keep(KestContentInfo& record);
     /// Puts `fragment` in the place of the first `placeholder` in the contents.
     void __attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment);
     /// `cleaned` is the element's text without what old contents have too much.
@@ -50,6 +52,7 @@ private:
                                        bool inclusive) {
         return KestMarkup::extractString(text, start, end, inclusive);
     }
+    /// With the paths of files that are relative to the application's shared resources made absolute.
     std::string __convertHrefPath(const std::string& appid, const std::string& text);
 
     // String resources and translation.

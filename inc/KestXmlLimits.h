@@ -1,5 +1,7 @@
 #pragma once
 
+#include <cstddef>
+#include <cstdint>
 #include <string>
 
 /// Whether the parser can be trusted with a file's text. It takes time that grows with the square of some counts, and
@@ -9,8 +11,8 @@ public:
     /// No file of a catalogue is longer.
     static const size_t longestFile = 16 * 1024 * 1024;
 
-    /// False for a text that is too long, has more than three million tags, 256 attributes in one of them or 256
-    /// namespaces in all, or a document type that is longer than 64 KiB with its document, or that declares
-    /// attributes or parameter entities.
-    static bool accept(const std::string& text);
+    /// False for a text that has more than three million tags, a document type that is longer than 64 KiB with its
+    /// document, or that declares attributes or parameter entities, and for one that is heavier than 64 MiB.
+    /// Else `weight` is what parsing it takes beside going through it, in bytes of text that take as long.
+    static bool accept(const std::string& text, std::uint64_t& weight);
 };

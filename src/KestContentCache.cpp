@@ -63,6 +63,20 @@ void KestContentCache::load(const std::string& path, KestContentInfo& record) {
     }
 }
 
+std::uint64_t KestContentCache::sizeOf(const KestContentInfo& record) {
+    std::uint64_t size = 0;
+    for (const CachedField& cached : cachedFields) {
+        size += (record.*cached.field).size();
+    }
+    return size;
+}
+
+void KestContentCache::clear(KestContentInfo& record) {
+    for (const CachedField& cached : cachedFields) {
+        std::string().swap(record.*cached.field);
+    }
+}
+
 bool KestContentCache::readLanguage(std::string& language) {
     return readString(languageKey, language);
 }

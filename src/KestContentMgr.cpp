@@ -22,9 +22,6 @@ const char languageKey[] = "db/menu_widget/language";
 /// More menus than anybody scrolls through; only files that go wrong have them.
 const size_t mostMenus = 20000;
 
-/// A text is searched, looked up, marked up and copied so many times until it is translated.
-const std::uint64_t passesOverText = 32;
-
 }  // namespace
 
 KestContentMgr* KestContentMgr::getInstance() {
@@ -52,7 +49,10 @@ bool KestContentMgr::loadContentsList(bool force) {
     }
     if (!force && __checkCacheAvailable()) {
         for (KestContentInfo& record : contentsList) {
-            __getFromPreference(record.path, record);
+            if (work.keepsMore()) {
+                __getFromPreference(record.path, record);
+                __keep(record);
+            }
             record.iconPath = __getIconPath(record.appid);
         }
         return true;
@@ -152,7 +152,19 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
         }
     }
     __saveToPreference(record);
+    __keep(record);
     return true;
+}
+
+void KestContentMgr::__keep(KestContentInfo& record) {
+    // It has been put together piece by piece, and may have room for as much again.
+    record.textContents.shrink_to_fit();
+    if (!work.spendOnKeeping(KestContentCache::sizeOf(record))) {
+        KEST_WARN("too much text: %s", record.path.c_str());
+        const std::string icon = record.iconPath;
+        KestContentCache::clear(record);
+        record.iconPath = icon;
+    }
 }
 
 void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
@@ -185,46 +197,6 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
     }
 }
 
-void KestContentMgr::__attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment) {
-    if (!work.spendOnText(KestLoadWork::ofMoving(record.textContents.size()))) {
-        KEST_WARN("too much to attach: %s", record.path.c_str());
-        return;
-    }
-    const size_t found = KestMarkup::find(record.textContents, placeholder, 0);
-    if (found != std::string::npos) {
-        record.textContents.replace(found, placeholder.size(), fragment);
-    }
-}
-
-std::string KestContentMgr::__translateById(xmlNode* node, const std::string& domain, const std::string& text,
-                                            std::string& usedId) {
-    const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
-    const std::string name = KestXmlDocument::str(id);
-    if (!id || !work.spendOnText(0) || !__isStringAvailable(name, domain)) {
-        return text;
-    }
-    std::string translation = __getString(name, domain);
-    if (!work.spendOnText(passesOverText * translation.size())) {
-        return text;
-    }
-    usedId = name;
-    return translation;
-}
-
-void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
-    const std::string translated = __translateContents(record.textdomain, cleaned);
-    record.textContents =
-        work.spendOnText(translated.size()) ? __convertHrefPath(record.appid, translated) : translated;
-    if (record.textContents.empty()) {
-        record.textContents = text;
-    }
-}
-
-std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
-    // The directory begins with a slash itself; the text engine expects both.
-    return __replaceString(text, "href=file:", "href=file:/" + sharedResources.of(appid), false);
-}
-
 void KestContentMgr::__loadStringResource(const KestContentInfo& record) {
     KEST_BEGIN();
     const std::string path = __replaceString(__detailPath(record), ".xml", "-string.xml", true);
@@ -250,11 +222,10 @@ std::string KestContentMgr::__translateContents(const std::string& domain, const
             KEST_INFO("xml contents error: text id string part");
             return __extractString(tag, ">", "<", false);
         }
-        const std::string value = __getString(id, domain);
+        const std::string value = work.spendOnText(tag.size()) ? __getString(id, domain) : "";
         // Markup only makes it longer.
-        if (value.size() > KestTextTags::longestContents ||
-            !work.spendOnText(passesOverText * (tag.size() + value.size())) ||
-            !tags.replaceFirst(KestMarkup::fromTranslation(value))) {
+        if (!work.spendOnText(KestLoadWork::ofTranslating(tag.size() + value.size())) ||
+            value.size() > KestTextTags::longestContents || !tags.replaceFirst(KestMarkup::fromTranslation(value))) {
             KEST_INFO("xml contents error: text id string part");
             break;
         }

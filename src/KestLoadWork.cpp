@@ -7,21 +7,21 @@ const std::uint64_t mebibyte = 1024 * 1024;
 const std::uint64_t mostTextOfDetail = 1024 * mebibyte;
 const std::uint64_t mostText = 4 * mostTextOfDetail;
 const std::uint64_t mostFiles = 256 * mebibyte;
+const std::uint64_t mostKept = 64 * mebibyte;
 
 /// Looking up a short text costs as much as copying one of this length.
 const std::uint64_t leastText = 4096;
 
 bool take(std::uint64_t& left, std::uint64_t amount) {
-    if (amount > left) {
-        return false;
-    }
-    left -= amount;
-    return true;
+    const bool enough = amount <= left;
+    left = enough ? left - amount : 0;
+    return enough;
 }
 
 }  // namespace
 
-KestLoadWork::KestLoadWork() : textBytes(mostText), detailTextBytes(mostTextOfDetail), fileBytes(mostFiles) {}
+KestLoadWork::KestLoadWork()
+    : textBytes(mostText), detailTextBytes(mostTextOfDetail), fileBytes(mostFiles), keptBytes(mostKept) {}
 
 void KestLoadWork::beginDetail() {
     detailTextBytes = mostTextOfDetail;
@@ -29,9 +29,13 @@ void KestLoadWork::beginDetail() {
 
 bool KestLoadWork::spendOnText(std::uint64_t bytes) {
     const std::uint64_t cost = leastText + bytes;
-    return cost <= textBytes && take(detailTextBytes, cost) && take(textBytes, cost);
+    return take(detailTextBytes, cost) && take(textBytes, cost);
 }
 
 bool KestLoadWork::spendOnFile(std::uint64_t bytes) {
     return take(fileBytes, bytes);
+}
+
+bool KestLoadWork::spendOnKeeping(std::uint64_t bytes) {
+    return take(keptBytes, bytes);
 }

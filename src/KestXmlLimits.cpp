@@ -2,13 +2,9 @@
 
 #include "KestMarkup.h"
 
-#include <array>
+#include <cctype>
 
 namespace {
-
-/// The parser compares every attribute of a tag with all the others, and every prefix with all namespaces in force.
-const size_t mostAttributes = 256;
-const size_t mostNamespaces = 256;
 
 /// A tag of four bytes becomes an element of more than a hundred.
 const size_t mostTags = 3000000;
@@ -16,78 +12,71 @@ const size_t mostTags = 3000000;
 /// What entities stand for may hold tags that nobody can count without expanding them.
 const size_t longestWithDocumentType = 64 * 1024;
 
-bool hasAt(const std::string& text, size_t at, const std::string& what) {
-    return text.compare(at, what.size(), what) == 0;
+const std::uint64_t heaviest = 64 * 1024 * 1024;
+
+/// A comparison takes a third of the time that a byte of text does.
+const std::uint64_t comparisonsOfByte = 2;
+
+/// The shortest attribute: a blank, a letter, "=" and two quotes.
+const std::uint64_t shortestAttribute = 5;
+
+/// Every attribute of a tag is compared with those before it.
+std::uint64_t comparisonsOf(std::uint64_t attributes) {
+    return attributes * attributes / 2;
 }
 
-/// Counts tags, and in each its attributes: values in quotes between a "<" and its ">". A value cannot hold a "<", so
-/// each begins anew.
-class Markup {
+/// Counts what the parser compares: the attributes of each tag with each other, and the names of tags and attributes
+/// with the namespaces in force.
+/// Nothing is taken for a comment or a section: where one ends the parser, which goes on after errors, may see it
+/// otherwise. A tag ends at its ">" or at the next "<", since no attribute's value can hold that, and every attribute
+/// has a value in quotes after a "=". So the parser never finds more than is counted here, wherever it finds tags.
+class Comparisons {
 public:
-    explicit Markup(const std::string& whole) : text(whole) {}
+    explicit Comparisons(const std::string& whole) : text(whole) {}
 
-    bool isTooMuch(bool withDocumentType) {
-        for (size_t at = 0; at < text.size() && !tooMuch; ++at) {
-            if (text[at] == '<') {
-                // In a document type the same characters may mean something else.
-                at = withDocumentType ? at : __skipSection(at);
-                __beginTag();
-            } else if (inTag) {
-                __read(at);
-            }
+    /// False where there are more tags than any catalogue has.
+    bool count() {
+        for (size_t at = text.find('<'); at != std::string::npos && tags <= mostTags; at = text.find('<', at)) {
+            ++tags;
+            at = __readTag(at + 1);
         }
-        return tooMuch;
+        return tags <= mostTags;
     }
 
+    std::uint64_t inAll() const { return ofAttributes + namespaces * (tags + attributesInAll); }
+
 private:
-    /// Where the markup goes on after a section, a comment or an instruction that begins at `at`; `at` itself where
-    /// none does, or where it does not end.
-    size_t __skipSection(size_t at) {
-        for (Section& section : sections) {
-            if (section.mayEnd && hasAt(text, at, section.begin)) {
-                const size_t end = KestMarkup::find(text, section.end, at);
-                section.mayEnd = end != std::string::npos;
-                return section.mayEnd ? end : at;
+    /// From behind its "<"; where it ends.
+    size_t __readTag(size_t at) {
+        std::uint64_t attributes = 0;
+        bool beforeValue = false;
+        for (; at < text.size() && text[at] != '<' && text[at] != '>'; ++at) {
+            const char character = text[at];
+            if (beforeValue && (character == '"' || character == '\'')) {
+                ++attributes;
+                at = __endOfValue(at);
+            } else if (character == 'x' && text.compare(at, 5, "xmlns") == 0) {
+                ++namespaces;
             }
+            beforeValue = character == '=' || (beforeValue && std::isspace(static_cast<unsigned char>(character)));
         }
+        attributesInAll += attributes;
+        ofAttributes += comparisonsOf(attributes);
         return at;
     }
 
-    void __beginTag() {
-        inTag = true;
-        quote = '\0';
-        attributes = 0;
-        tooMuch = ++tags > mostTags;
+    /// The closing quote, or where a value breaks off that has none.
+    size_t __endOfValue(size_t at) const {
+        const char end[] = {text[at], '<', '\0'};
+        const size_t found = text.find_first_of(end, at + 1);
+        return found == std::string::npos ? text.size() - 1 : found - (text[found] == '<' ? 1 : 0);
     }
-
-    void __read(size_t at) {
-        const char character = text[at];
-        if (quote) {
-            quote = character == quote ? '\0' : quote;
-        } else if (character == '>') {
-            inTag = false;
-        } else if (character == '"' || character == '\'') {
-            quote = character;
-            tooMuch = ++attributes > mostAttributes;
-        } else if (character == 'x' && hasAt(text, at, "xmlns")) {
-            tooMuch = ++namespaces > mostNamespaces;
-        }
-    }
-
-    struct Section {
-        std::string begin;
-        std::string end;
-        bool mayEnd;
-    };
 
     const std::string& text;
-    std::array<Section, 3> sections{{{"<![CDATA[", "]]>", true}, {"<!--", "-->", true}, {"<?", "?>", true}}};
-    bool inTag = false;
-    char quote = '\0';
-    bool tooMuch = false;
-    size_t tags = 0;
-    size_t attributes = 0;
-    size_t namespaces = 0;
+    std::uint64_t tags = 0;
+    std::uint64_t namespaces = 0;
+    std::uint64_t attributesInAll = 0;
+    std::uint64_t ofAttributes = 0;
 };
 
 bool hasDocumentType(const std::string& text) {
@@ -116,8 +105,14 @@ bool isBadDocumentType(const std::string& text) {
 
 const size_t KestXmlLimits::longestFile;
 
-bool KestXmlLimits::accept(const std::string& text) {
-    const bool withDocumentType = hasDocumentType(text);
-    return text.size() <= longestFile && !(withDocumentType && isBadDocumentType(text)) &&
-           !Markup(text).isTooMuch(withDocumentType);
+bool KestXmlLimits::accept(const std::string& text, std::uint64_t& weight) {
+    if (hasDocumentType(text)) {
+        // Entities can stand for attributes, one after the other, that are in none of its tags.
+        weight = comparisonsOf(text.size() / shortestAttribute) / comparisonsOfByte;
+        return !isBadDocumentType(text);
+    }
+    Comparisons comparisons(text);
+    const bool readable = comparisons.count();
+    weight = comparisons.inAll() / comparisonsOfByte;
+    return readable && weight <= heaviest;
 }

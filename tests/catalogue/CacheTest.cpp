@@ -1,59 +1,12 @@
-#include "CatalogueTest.h"
-
-#include <app_preference.h>
-
-#include <functional>
-#include <map>
+#include "CacheTest.h"
 
 using namespace manager_log;
 using kest_files::contents;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using testing::Not;
 using testing::Pair;
-
-namespace {
-
-std::vector<std::pair<std::string, std::string>> written;
-std::vector<std::string> asked;
-/// What happens beside the load when it writes that key.
-std::map<std::string, std::function<void()>> meanwhile;
-
-}  // namespace
-
-extern "C" {
-int __real_preference_set_string(const char* key, const char* value);
-int __wrap_preference_set_string(const char* key, const char* value);
-int __real_preference_get_string(const char* key, char** value);
-int __wrap_preference_get_string(const char* key, char** value);
-}
-
-int __wrap_preference_set_string(const char* key, const char* value) {
-    written.emplace_back(key, value);
-    if (const auto event = meanwhile.find(key); event != meanwhile.end())
-        event->second();
-    return __real_preference_set_string(key, value);
-}
-
-int __wrap_preference_get_string(const char* key, char** value) {
-    asked.emplace_back(key);
-    return __real_preference_get_string(key, value);
-}
-
-class Cache : public CatalogueTest {
-protected:
-    /// A cache of the catalogue as the device is now, of one tip.
-    void fill() {
-        loadTip("<title>Cached</title>");
-        written.clear();
-        asked.clear();
-    }
-    /// What the next start of the application loads.
-    std::vector<KestContentInfo> loadAtNextStart() { return load(false); }
-    /// A load from the files leaves this trace, one from the cache does not.
-    bool loadedFromFiles() const { return testing::Value(log(), Contains(begin("__loadDetailMenu"))); }
-};
+using namespace preference_calls;
 
 TEST_F(Cache, IsNotWrittenForATipWhoseFileGoesDuringTheLoad) {
     writeTip("<title>Title</title>");
@@ -65,7 +18,17 @@ TEST_F(Cache, IsNotWrittenForATipWhoseFileGoesDuringTheLoad) {
     EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + file.string())));
     EXPECT_THAT(log(), Contains(info("loadContentsList", "__loadDetailMenu failed : " + kest)));
     EXPECT_EQ(preference("contents_tip.xml_menuTitle"), std::nullopt);
-    meanwhile.clear();
+}
+
+TEST_F(Cache, OfATipHasTheStringsOfOneBeforeItWhoseFileWentDuringTheLoad) {
+    writeMenus({{}, {"contents/other.xml"}});
+    writeDetail("<title>Gone</title>");
+    writeStrings({{"en", "IDS_MINE", "Mine"}});
+    writeDetail("<title id=\"IDS_MINE\">untranslated</title>", "contents/other.xml");
+    const auto file = resources() / tipPath;
+    meanwhile["KestCurrentLanguage"] = [&file] { std::filesystem::remove(file); };
+    EXPECT_EQ(load().at(1).menuTitle, "Mine");
+    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + file.string())));
 }
 
 TEST_F(Cache, IsWrittenFieldByFieldAfterEachTip) {
@@ -211,103 +174,4 @@ TEST_F(Cache, AsksForTheIconAfresh) {
     setPreference("contents_tip.xml_iconPath", "/old/icon.png");
     EXPECT_EQ(loadAtNextStart().at(0).iconPath, device()->packages().find("com.example.clock")->icon);
     ASSERT_FALSE(loadedFromFiles());
-}
-
-TEST_F(Cache, IsNotUsedWhenALoadIsForced) {
-    fill();
-    writeDetail("<title>Changed</title>");
-    EXPECT_THAT(titles(load(true)), ElementsAre("Changed"));
-    EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Language changed"))));
-    EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Version changed!!"))));
-}
-
-TEST_F(Cache, IsInvalidWithoutALineWhenItHasNoLanguage) {
-    writeTip("<title>A</title>");
-    device()->preferences().clear(kest);
-    loadAtNextStart();
-    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"), begin("__loadDetailMenu"),
-                                   begin("__loadStringResource"), hit("__saveToPreference")));
-}
-
-TEST_F(Cache, IsInvalidForAnotherLanguage) {
-    fill();
-    setLanguage("ko_KR.UTF-8");
-    loadAtNextStart();
-    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
-                                   info("__checkCacheAvailable", "Language changed"), begin("__loadDetailMenu"),
-                                   begin("__loadStringResource"), hit("__saveToPreference")));
-    EXPECT_EQ(preference("KestCurrentLanguage"), "ko_KR.UTF-8");
-}
-
-TEST_F(Cache, ComparesLanguagesExactly) {
-    fill();
-    setLanguage("en_US");
-    loadAtNextStart();
-    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
-    EXPECT_TRUE(loadedFromFiles());
-}
-
-TEST_F(Cache, IsInvalidWhenTheDeviceNamesNoLanguage) {
-    fill();
-    device()->settings().remove(device::keys::language);
-    loadAtNextStart();
-    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
-    EXPECT_TRUE(loadedFromFiles());
-}
-
-TEST_F(Cache, IsInvalidForAnotherVersion) {
-    fill();
-    upgradeTo("1.0.1");
-    loadAtNextStart();
-    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
-                                   info("__checkCacheAvailable", "Version changed!!"), begin("__loadDetailMenu"),
-                                   begin("__loadStringResource"), hit("__saveToPreference")));
-    EXPECT_EQ(preference("KestPackageVersion"), "1.0.1");
-}
-
-TEST_F(Cache, IsInvalidAfterALoadThatWasCutShort) {
-    fill();
-    setPreference("KestPackageVersion", "");
-    loadAtNextStart();
-    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Version changed!!")));
-    EXPECT_TRUE(loadedFromFiles());
-    EXPECT_EQ(preference("KestPackageVersion"), "1.0.0");
-}
-
-TEST_F(Cache, IsValidForAnEmptyVersionOfAPackageWithoutOne) {
-    upgradeTo("");
-    fill();
-    ASSERT_EQ(preference("KestPackageVersion"), "");
-    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Cached"));
-    EXPECT_FALSE(loadedFromFiles());
-}
-
-TEST_F(Cache, IsValidWhenItsVersionCannotBeRead) {
-    fill();
-    const auto all = device()->preferences().all(kest);
-    device()->preferences().clear(kest);
-    for (const auto& [key, value] : all)
-        if (key != "KestPackageVersion")
-            setPreference(key, value);
-    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("Cached"));
-    EXPECT_FALSE(loadedFromFiles());
-}
-
-TEST_F(Cache, FollowsTheRegionOfTheMainMenuFile) {
-    writeDetail("<title>A</title>", "contents/a.xml");
-    writeDetail("<title>B</title>", "contents/b.xml");
-    writeMenus({{"contents/a.xml"}, {"contents/b.xml", kest, "Global,India"}});
-    EXPECT_THAT(titles(load()), ElementsAre("A", "B"));
-    setCountry("IN");
-    EXPECT_THAT(titles(loadAtNextStart()), ElementsAre("B"));
-    EXPECT_FALSE(loadedFromFiles());
-}
-
-TEST_F(Cache, OfNoLanguageIsInvalidWhereTheDeviceNamesNone) {
-    fill();
-    setPreference("KestCurrentLanguage", "");
-    device()->settings().remove(device::keys::language);
-    loadAtNextStart();
-    EXPECT_TRUE(loadedFromFiles());
-    EXPECT_THAT(log(), Contains(info("__checkCacheAvailable", "Language changed")));
 }

@@ -46,6 +46,30 @@ TEST_F(HostileFile, DetailMayBeAFifo) {
     expectNoDetail();
 }
 
+TEST_F(HostileFile, DetailMayBeOfSixteenMebibytesAndNoLonger) {
+    writeMenus({{}});
+    const std::string begin = "<tip><items><item><title>Title</title></item></items><!--";
+    const std::string end = "--></tip>";
+    const std::size_t rest = (std::size_t{16} << 20) - begin.size() - end.size();
+    // The parser takes no comment of more than ten megabytes.
+    std::string comments = repeated("-->" + std::string(1017, ' ') + "<!--", rest / 1024);
+    comments.resize(rest, 'x');
+    support::writeFile(detailFile(), begin + comments + end);
+    EXPECT_THAT(titles(load()), ElementsAre("Title"));
+    support::writeFile(detailFile(), begin + comments + "x" + end);
+    EXPECT_THAT(titles(load()), ElementsAre(""));
+    EXPECT_THAT(errors(), Contains(error("__loadDetailMenu", "Failed to xmlReadFile")));
+}
+
+TEST_F(HostileFile, DetailMaySayThatItIsEmptyAndKeepItsReaderWaiting) {
+    writeMenus({{}});
+    // It is a regular file of no bytes by its status, and a stream without an end by its contents.
+    std::filesystem::create_directories(detailFile().parent_path());
+    std::filesystem::create_symlink("/proc/kmsg", detailFile());
+    EXPECT_THAT(titles(load()), ElementsAre(""));
+    EXPECT_THAT(errors(), Contains(error("__loadDetailMenu", "Failed to xmlReadFile")));
+}
+
 TEST_F(HostileFile, DetailMayBeUnreadable) {
     writeMenus({{}});
     writeDetail("<title>Title</title>");

@@ -1,54 +1,7 @@
-#include "HostileTest.h"
+#include "HostileXmlTest.h"
 
 using namespace manager_log;
 using testing::IsEmpty;
-
-/// Entities: declared in a few bytes, they can stand for more than the machine has.
-class HostileXml : public HostileTest {
-protected:
-    void SetUp() override { testing::internal::CaptureStderr(); }
-    /// The parser has much to say of these files; none of it is for people.
-    void TearDown() override { EXPECT_EQ(testing::internal::GetCapturedStderr(), ""); }
-
-    static std::string file(const std::string& declarations, const std::string& item) {
-        return std::string(kest_files::xmlHead) + "<!DOCTYPE tip [\n" + declarations + "]>\n<tip>\n<items>\n<item>\n" +
-               item + "</item>\n</items>\n</tip>\n";
-    }
-    static std::string entity(const std::string& name, const std::string& value) {
-        return "<!ENTITY " + name + " \"" + value + "\">\n";
-    }
-    /// "&a9;" stands for ten to the ninth words.
-    static std::string billionLaughs() {
-        std::string declarations = entity("a0", "lol");
-        for (int i = 1; i < 10; ++i)
-            declarations += entity("a" + std::to_string(i), repeated("&a" + std::to_string(i - 1) + ";", 10));
-        return declarations;
-    }
-    /// The same without a document type.
-    static std::string plain(const std::string& item) { return "<tip><items><item>" + item + "</item></items></tip>"; }
-    /// Stands for a million letters.
-    static std::string longEntity() {
-        return entity("part", std::string(10000, 'a')) + entity("long", repeated("&part;", 100));
-    }
-    static std::string withAttributes(int count, const std::string& value) {
-        std::string all;
-        for (int i = 0; i < count; ++i)
-            all += " a" + std::to_string(i) + value;
-        return plain("<title" + all + ">Title</title>");
-    }
-    void expectNotParsed(const std::string& text) {
-        EXPECT_EQ(loadDetail(text).menuTitle, "");
-        EXPECT_THAT(errors(), testing::Contains(error("__loadDetailMenu", "Failed to xmlReadFile")));
-    }
-    KestContentInfo loadDetail(const std::string& text) {
-        writeMenus({{}});
-        support::writeFile(resources() / tipPath, text);
-        const auto records = load();
-        EXPECT_TRUE(result());
-        return records.at(0);
-    }
-    void writeStringFile(const std::string& text) { support::writeFile(resources() / "contents/tip-string.xml", text); }
-};
 
 TEST_F(HostileXml, EntityOfTheFilesOwnIsPutIn) {
     EXPECT_EQ(loadDetail(file(entity("name", "Kest"), "<title>About &name; &amp; &#65;</title>")).menuTitle,
@@ -175,46 +128,6 @@ TEST_F(HostileXml, ExternalFilesAreNeverOpened) {
     }
 }
 
-TEST_F(HostileXml, MayHaveHundredsOfAttributes) {
-    EXPECT_EQ(loadDetail(withAttributes(256, "='x'")).menuTitle, "Title");
-}
-
-TEST_F(HostileXml, IsNotParsedWithMoreAttributesHoweverTheyAreWritten) {
-    for (const char* value : {"='x'", "=\"x\"", "= 'x'", " =\n'x'", "='>'", "=\"'\""})
-        expectNotParsed(withAttributes(257, value));
-}
-
-TEST_F(HostileXml, MayHaveThousandsOfQuotesInItsText) {
-    const std::string text = repeated("say=\"x\" it's > ", 10000);
-    EXPECT_EQ(loadDetail(plain("<title>" + text + "</title>")).menuTitle, text);
-}
-
-TEST_F(HostileXml, MayHaveThousandsOfEscapedTextTags) {
-    const std::string tags = repeated("&lt;text id=\"IDS_OWN\"&gt;x&lt;/text&gt;", 5000);
-    EXPECT_EQ(loadDetail(plain("<contents>" + tags + "</contents>")).textContents, repeated("Own text", 5000));
-}
-
-TEST_F(HostileXml, MayHaveHundredsOfQuotesInASectionOrAComment) {
-    const std::string quotes = "x < y " + repeated("\"x\" xmlns ", 300);
-    EXPECT_EQ(
-        loadDetail(plain("<!-- " + quotes + "--><?note " + quotes + "?><title><![CDATA[" + quotes + "]]></title>"))
-            .menuTitle,
-        quotes);
-}
-
-TEST_F(HostileXml, MayNameAFewNamespaces) {
-    EXPECT_EQ(loadDetail("<tip xmlns='a' xmlns:b='b'><items><item><title>Title</title></item></items></tip>").menuTitle,
-              "Title");
-}
-
-TEST_F(HostileXml, CannotHideAttributesBehindWhatLooksLikeAComment) {
-    const std::string tag = withAttributes(257, "='x'");
-    expectNotParsed("<?x <!-- ?>" + tag + "<?y --> ?>");
-    expectNotParsed("<!-- <![CDATA[ -->" + tag + "<!-- ]]> -->");
-    expectNotParsed("<!-- <? -->" + tag + "<?y ?>");
-    expectNotParsed(repeated("<!--", 100000) + tag);
-}
-
 TEST_F(HostileXml, ManyElementsOfEntitiesAreLeftOut) {
     const std::string declarations = entity("a", repeated("<x/>", 5000)) + entity("b", repeated("&a;", 5000));
     EXPECT_EQ(loadDetail(file(declarations, "<title>a" + repeated("&b;", 60) + "c</title>")).menuTitle, "ac");
@@ -225,25 +138,6 @@ TEST_F(HostileXml, AnIdMayBeManyReferences) {
                     "</stringid><value>Mine</value></item></items></strings>");
     EXPECT_EQ(loadDetail(file(entity("a", "aa"), "<title id='" + repeated("&a;", 4000) + "'>x</title>")).menuTitle,
               "Mine");
-}
-
-TEST_F(HostileXml, IsNotParsedWithHundredsOfNamespaces) {
-    // Every element with a prefix asks for it among all of them.
-    std::string declarations;
-    for (int i = 0; i < 257; ++i)
-        declarations += "<x xmlns:n" + std::to_string(i) + "='n'>";
-    expectNotParsed(plain(declarations + repeated("<z:a/>", 1000) + repeated("</x>", 257)));
-}
-
-TEST_F(HostileXml, IsNotParsedWithMillionsOfElements) {
-    expectNotParsed(plain(repeated("<x/>", 3000001)));
-}
-
-TEST_F(HostileXml, MayHaveAMillionElements) {
-    EXPECT_EQ(loadDetail("<tip>" + repeated("<x/>", 500000) + "<items>" + repeated("<x/>", 500000) + "<item>" +
-                         repeated("<x/>", 500000) + "<title>Title</title></item></items></tip>")
-                  .menuTitle,
-              "Title");
 }
 
 TEST_F(HostileXml, NamesFieldsByElementsOnly) {

@@ -12,7 +12,14 @@ TEST(LoadWork, OfOneDetailIsAGibibyteOfText) {
     KestLoadWork work;
     EXPECT_TRUE(work.spendOnText(gibibyte - some));
     EXPECT_FALSE(work.spendOnText(some));
-    EXPECT_TRUE(work.spendOnText(0)) << "what was refused has cost nothing";
+    EXPECT_FALSE(work.spendOnText(0)) << "who asks for too much gets nothing more";
+    work.beginDetail();
+    EXPECT_TRUE(work.spendOnText(gibibyte - some)) << "another detail does";
+}
+
+TEST(LoadWork, OfTranslatingIsMoreThanOfMoving) {
+    EXPECT_EQ(KestLoadWork::ofTranslating(1600), 51200U);
+    EXPECT_EQ(KestLoadWork::ofMoving(1600), 100U);
 }
 
 TEST(LoadWork, OfAllDetailsIsFourGibibytesOfText) {
@@ -31,6 +38,15 @@ TEST(LoadWork, OfShortTextsEndsToo) {
     while (texts < 1000000 && work.spendOnText(0))
         ++texts;
     EXPECT_EQ(texts, 262144);
+}
+
+TEST(LoadWork, KeepsSixtyFourMebibytes) {
+    KestLoadWork work;
+    EXPECT_TRUE(work.spendOnKeeping(gibibyte / 16 - 1));
+    EXPECT_TRUE(work.keepsMore());
+    EXPECT_FALSE(work.spendOnKeeping(2));
+    EXPECT_FALSE(work.keepsMore());
+    EXPECT_FALSE(work.spendOnKeeping(1));
 }
 
 TEST(LoadWork, OnFilesIsAQuarterOfAGibibyte) {

@@ -18,6 +18,8 @@ static void throwIfPlanned() {
 
 extern "C" {
 
+Evas_Object* __real_elm_naviframe_item_pop(Evas_Object* naviframe);
+Evas_Object* __wrap_elm_naviframe_item_pop(Evas_Object* naviframe);
 Evas_Object* __real_elm_genlist_add(Evas_Object* parent);
 Evas_Object* __wrap_elm_genlist_add(Evas_Object* parent);
 Elm_Object_Item* __real_elm_genlist_item_append(Evas_Object* list, const Elm_Genlist_Item_Class* itc, const void* data,
@@ -59,6 +61,12 @@ int __real_ravella_log_manager_insert(ravella_log_manager_h handle, const char* 
 int __wrap_ravella_log_manager_insert(ravella_log_manager_h handle, const char* uri, bundle* record,
                                       ravella_log_insert_cb callback, void* data, int* request);
 
+Evas_Object* __wrap_elm_naviframe_item_pop(Evas_Object* naviframe) {
+    if (made().whenPopped)
+        made().whenPopped();
+    return __real_elm_naviframe_item_pop(naviframe);
+}
+
 Evas_Object* __wrap_elm_genlist_add(Evas_Object* parent) {
     return made().failGenlist ? nullptr : __real_elm_genlist_add(parent);
 }
@@ -66,6 +74,7 @@ Evas_Object* __wrap_elm_genlist_add(Evas_Object* parent) {
 Elm_Object_Item* __wrap_elm_genlist_item_append(Evas_Object* list, const Elm_Genlist_Item_Class* itc, const void* data,
                                                 Elm_Object_Item* parent, Elm_Genlist_Item_Type type, Evas_Smart_Cb func,
                                                 const void* funcData) {
+    made().steps.emplace_back("row");
     made().rows.push_back({itc, data, func, funcData, type});
     return __real_elm_genlist_item_append(list, itc, data, parent, type, func, funcData);
 }
@@ -90,6 +99,7 @@ void __wrap_elm_genlist_item_selected_set(Elm_Object_Item* row, Eina_Bool select
 
 void __wrap_elm_object_item_domain_translatable_part_text_set(Elm_Object_Item* item, const char* part,
                                                               const char* domain, const char* text) {
+    made().steps.emplace_back("title");
     made().translatableTexts.push_back(std::string(part) + ": " + text + " of " + domain);
     __real_elm_object_item_domain_translatable_part_text_set(item, part, domain, text);
 }
@@ -118,6 +128,7 @@ void __wrap_uxt_theme_delete_changed_callback(Evas_Object* object, uxt_theme_cha
 }
 
 int __wrap_package_manager_create(package_manager_h* manager) {
+    made().steps.emplace_back("package manager");
     made().registrations.emplace_back("package create");
     return __real_package_manager_create(manager);
 }

@@ -27,6 +27,9 @@ struct Made {
     std::vector<Row> rows;
     int clears = 0;
     int updates = 0;
+    /// Which calls filled the list and its title, in order: "row", "title", "package manager".
+    std::vector<std::string> steps;
+    std::function<void()> whenPopped;  ///< called before each pop of the naviframe
     std::vector<std::string> themeExtensions;
     /// Texts that follow the language: "<part>: <id> of <domain>".
     std::vector<std::string> translatableTexts;

@@ -139,6 +139,15 @@ TEST_F(Rows, FillTheListAsItIsSetUp) {
     evas_object_size_hint_align_get(list(), &x, &y);
     EXPECT_THAT(std::make_pair(x, y), Pair(EVAS_HINT_FILL, EVAS_HINT_FILL));
     EXPECT_TRUE(evas_object_visible_get(list()));
+    EXPECT_EQ(calls::made().updates, 1);
+    evas_object_size_hint_weight_get(naviframe().getTopView()->getEvasObj(), &x, &y);
+    EXPECT_THAT(std::make_pair(x, y), Pair(EVAS_HINT_EXPAND, EVAS_HINT_EXPAND));
+}
+
+TEST_F(Rows, ComeBeforeTheTitleAndThatBeforeTheNewsOfPackages) {
+    writeTips({"A", "B"});
+    start();
+    EXPECT_THAT(calls::made().steps, ElementsAre("row", "row", "row", "title", "package manager"));
 }
 
 TEST_F(Rows, LieInTheListsGroupOfTheApplicationsTheme) {

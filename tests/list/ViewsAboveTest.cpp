@@ -33,6 +33,19 @@ TEST_F(ViewsAbove, AreClosedOneAtAPackageChange) {
     EXPECT_EQ(levels(), 2U);
 }
 
+TEST_F(ViewsAbove, AreClosedBeforeTheCatalogueIsLoadedAtAPackageChange) {
+    startBeneathTwoViews();
+    newLog();
+    std::vector<std::vector<kest_log::Line>> before;
+    calls::made().whenPopped = [&] { before.push_back(newLog()); };
+    device()->events().publishPackage(
+        {"com.example.other", device::PackageEvent::Type::Install, device::PackageEvent::State::Completed, 100, 0});
+    settle();
+    EXPECT_THAT(before, testing::ElementsAre(IsEmpty()));
+    EXPECT_THAT(newLog(), testing::Contains(kest_log::begin("KestContentMgr.cpp", "loadContentsList")));
+    calls::made().whenPopped = nullptr;
+}
+
 TEST_F(ViewsAbove, RemainWhenTheListGoesInTheMidstOfALanguageChange) {
     writeTips({"A"});
     start();

@@ -28,14 +28,15 @@ TEST_F(AppTest, IsCreatedStepByStep) {
     startWithoutView();
     EXPECT_EQ(running().status(), std::nullopt);
     std::vector<std::string> steps = calls::madeOf({"addEvent", "app_get_preinit", "elm_win_", "elm_app_base",
-                                                    "elm_naviframe_prev", "uxt_theme_add", "uxt_theme_set_font"});
+                                                    "elm_naviframe", "uxt_theme_add", "uxt_theme_set_font"});
     // The window that the launcher makes ahead.
     steps.erase(steps.begin());
     EXPECT_THAT(steps,
                 ElementsAre("addEventHandler 2 application", "app_get_preinitialized_window Kest",
                             "elm_win_title_set Kest", "elm_win_autodel_set true", "elm_win_wm_rotation_supported_get",
                             "elm_win_indicator_mode_set 2", "elm_win_indicator_opacity_set 1",
-                            "elm_app_base_scale_set 2.6", "elm_naviframe_prev_btn_auto_pushed_set naviframe true",
+                            "elm_app_base_scale_set 2.6", "elm_naviframe_add",
+                            "elm_naviframe_prev_btn_auto_pushed_set naviframe true",
                             "uxt_theme_add_color_table " + resource("table/com.ravella.kest_ChangeableColorInfo.xml"),
                             "uxt_theme_add_font_table " + resource("table/com.ravella.kest_ChangeableFontInfo.xml"),
                             "uxt_theme_set_font_table table"));

@@ -90,6 +90,11 @@ void addAndNoteEventHandler(EventHandler* self, app_event_type_e type, EventHand
     addEventHandler(self, type, std::move(handler), data);
 }
 
+CALL(Evas_Object*, elm_naviframe_add, Evas_Object* parent) {
+    note("elm_naviframe_add");
+    return __real_elm_naviframe_add(parent);
+}
+
 CALL(void*, app_get_preinitialized_window, const char* name) {
     note("app_get_preinitialized_window", name);
     return fails("app_get_preinitialized_window") ? nullptr : __real_app_get_preinitialized_window(name);

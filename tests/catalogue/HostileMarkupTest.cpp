@@ -1,0 +1,77 @@
+#include "HostileXmlTest.h"
+
+// Tags, attributes and namespaces that would take the parser longer than the square of their number.
+
+TEST_F(HostileXml, MayHaveThousandsOfAttributes) {
+    EXPECT_EQ(loadDetail(withAttributes(16000, "='x'")).menuTitle, "Title");
+}
+
+TEST_F(HostileXml, IsNotParsedWithMoreAttributesHoweverTheyAreWritten) {
+    for (const char* value : {"='x'", "=\"x\"", "= 'x'", " =\n'x'", "='>'", "=\"'\"", "='\"'", "=\r\t '>'"})
+        expectNotParsed(withAttributes(17000, value));
+}
+
+TEST_F(HostileXml, MayHaveThousandsOfQuotesInItsText) {
+    const std::string text = repeated("say=\"x\" it's > ", 10000);
+    EXPECT_EQ(loadDetail(plain("<title>" + text + "</title>")).menuTitle, text);
+}
+
+TEST_F(HostileXml, MayHaveThousandsOfEscapedTextTags) {
+    const std::string tags = repeated("&lt;text id=\"IDS_OWN\"&gt;x&lt;/text&gt;", 5000);
+    EXPECT_EQ(loadDetail(plain("<contents>" + tags + "</contents>")).textContents, repeated("Own text", 5000));
+}
+
+TEST_F(HostileXml, MayHaveHundredsOfQuotesInASectionOrAComment) {
+    const std::string quotes = "x < y " + repeated("\"x\" xmlns ", 300);
+    EXPECT_EQ(
+        loadDetail(plain("<!-- " + quotes + "--><?note " + quotes + "?><title><![CDATA[" + quotes + "]]></title>"))
+            .menuTitle,
+        quotes);
+}
+
+TEST_F(HostileXml, MayNameAFewNamespaces) {
+    EXPECT_EQ(loadDetail("<tip xmlns='a' xmlns:b='b'><items><item><title>Title</title></item></items></tip>").menuTitle,
+              "Title");
+}
+
+TEST_F(HostileXml, CannotHideAttributesBehindWhatLooksLikeAComment) {
+    const std::string tag = withAttributes(400000, "='x'");
+    expectNotParsed("<?x <!-- ?>" + tag + "<?y --> ?>");
+    expectNotParsed("<!-- <![CDATA[ -->" + tag + "<!-- ]]> -->");
+    expectNotParsed("<!-- <? -->" + tag + "<?y ?>");
+    expectNotParsed("<!--> <![CDATA[ -->" + tag + "]]>");
+    expectNotParsed("<? " + tag + " ?>");
+    expectNotParsed("<?>" + tag + "?>");
+    for (const char* begin : {"<!-- \x01", "<?x \x01", "<![CDATA[ \x01"})
+        expectNotParsed(plain(begin + tag + "--> ?> ]]>"));
+    expectNotParsed(repeated("<!--", 100000) + tag);
+    expectNotParsed("<tip a='<" + tag);
+    expectNotParsed("<tip a='\">' b=<" + tag);
+}
+
+TEST_F(HostileXml, MayHaveManyAttributesInEveryTag) {
+    const std::string tag = withAttributes(1000, "='x'");
+    EXPECT_EQ(
+        loadDetail("<tip><items><item>" + repeated(tag, 200) + "<title>Title</title></item></items></tip>").menuTitle,
+        "Title");
+    expectNotParsed("<tip><items><item>" + repeated(tag, 600) + "<title>Title</title></item></items></tip>");
+}
+
+TEST_F(HostileXml, MayHaveHundredsOfNamespaces) {
+    EXPECT_EQ(loadDetail(withNamespaces(500, repeated("<z:a/>", 10000))).menuTitle, "Title");
+}
+
+TEST_F(HostileXml, IsNotParsedWithThousandsOfNamespacesThatEveryElementAsksFor) {
+    expectNotParsed(withNamespaces(8000, repeated("<z:a/>", 1500000)));
+}
+
+TEST_F(HostileXml, IsNotParsedWithMillionsOfElements) {
+    expectNotParsed(plain(repeated("<x/>", 3000001)));
+}
+
+TEST_F(HostileXml, MayHaveAMillionElements) {
+    EXPECT_EQ(loadDetail("<tip>" + repeated("<x/>", 500000) + "<items>" + repeated("<x/>", 500000) + "<item>" +
+                         repeated("<x/>", 500000) + "<title>Title</title></item></items></tip>")
+                  .menuTitle,
+              "Title");
+}
