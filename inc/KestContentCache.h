@@ -15,8 +15,8 @@ public:
     static void load(const std::string& path, KestContentInfo& record);
     /// How many bytes the record's cached fields have.
     static std::uint64_t sizeOf(const KestContentInfo& record);
-    /// Empties them.
-    static void clear(KestContentInfo& record);
+    /// Empties them, but for the icon's path.
+    static void dropTexts(KestContentInfo& record);
 
     /// Display language and package version that the cache was built for. False when the key cannot be read.
     static bool readLanguage(std::string& language);

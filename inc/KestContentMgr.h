@@ -40,8 +40,6 @@ private:
     void __readDetail(xmlNode* node, KestContentInfo& record);
     /// Leaves the record without its texts where the load keeps too many already.
     void __keep(KestContentInfo& record);
-    /// Puts `fragment` in the place of the first `placeholder` in the contents.
-    void __attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment);
     /// `cleaned` is the element's text without what old contents have too much.
     void __setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned);
     static std::string __replaceString(const std::string& text, const std::string& from, const std::string& to,

@@ -71,9 +71,11 @@ std::uint64_t KestContentCache::sizeOf(const KestContentInfo& record) {
     return size;
 }
 
-void KestContentCache::clear(KestContentInfo& record) {
+void KestContentCache::dropTexts(KestContentInfo& record) {
     for (const CachedField& cached : cachedFields) {
-        std::string().swap(record.*cached.field);
+        if (cached.field != &KestContentInfo::iconPath) {
+            std::string().swap(record.*cached.field);
+        }
     }
 }
 

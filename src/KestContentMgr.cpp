@@ -8,6 +8,7 @@
 #include "KestPackageInfo.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
+#include "KestTextGrowth.h"
 #include "KestTextTags.h"
 #include "KestXmlDocument.h"
 
@@ -157,13 +158,10 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
 }
 
 void KestContentMgr::__keep(KestContentInfo& record) {
-    // It has been put together piece by piece, and may have room for as much again.
     record.textContents.shrink_to_fit();
     if (!work.spendOnKeeping(KestContentCache::sizeOf(record))) {
         KEST_WARN("too much text: %s", record.path.c_str());
-        const std::string icon = record.iconPath;
-        KestContentCache::clear(record);
-        record.iconPath = icon;
+        KestContentCache::dropTexts(record);
     }
 }
 
@@ -192,9 +190,35 @@ void KestContentMgr::__readDetail(xmlNode* node, KestContentInfo& record) {
     } else if (KestXmlDocument::isElement(node, "attach")) {
         const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
         if (content && id) {
-            __attach(record, KestXmlDocument::str(id), __convertHrefPath(record.appid, text));
+            KestTextGrowth::attach(record, KestXmlDocument::str(id), __convertHrefPath(record.appid, text), work);
         }
     }
+}
+
+std::string KestContentMgr::__translateById(xmlNode* node, const std::string& domain, const std::string& text,
+                                            std::string& usedId) {
+    const KestXmlDocument::Text id = KestXmlDocument::attribute(node, "id");
+    const std::string name = KestXmlDocument::str(id);
+    if (!id || !work.spendOnText(0) || !__isStringAvailable(name, domain)) {
+        return text;
+    }
+    std::string translation = __getString(name, domain);
+    if (!work.spendOnText(KestLoadWork::ofTranslating(translation.size()))) {
+        return text;
+    }
+    usedId = name;
+    return translation;
+}
+
+void KestContentMgr::__setContents(KestContentInfo& record, const std::string& text, const std::string& cleaned) {
+    record.textContents = __convertHrefPath(record.appid, __translateContents(record.textdomain, cleaned));
+    if (record.textContents.empty()) {
+        record.textContents = text;
+    }
+}
+
+std::string KestContentMgr::__convertHrefPath(const std::string& appid, const std::string& text) {
+    return KestTextGrowth::withAbsolutePaths(text, sharedResources.of(appid), work);
 }
 
 void KestContentMgr::__loadStringResource(const KestContentInfo& record) {

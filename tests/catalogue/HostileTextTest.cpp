@@ -163,8 +163,9 @@ TEST_F(HostileText, ContentsMayReferToHundredsOfThousandsOfFiles) {
 TEST_F(HostileText, ContentsMayReferToMoreFilesThanAnybodyReads) {
     const std::string text = repeated("href=file:", 700000);
     EXPECT_EQ(loadContents(text), text);
-    EXPECT_THAT(warnings(), Contains(kest_log::warning("KestContentTexts.cpp", "__convertHrefPath",
-                                                       "too many references to files: com.ravella.kest")));
+    EXPECT_THAT(warnings(),
+                Contains(kest_log::warning("KestTextGrowth.cpp", "withAbsolutePaths",
+                                           "too many references to files below " + resources().string() + "/")));
 }
 
 TEST_F(HostileText, AttachmentsMayBeFullOfReferences) {
@@ -250,5 +251,5 @@ TEST_F(HostileText, AttachmentsMayBeTenThousand) {
 TEST_F(HostileText, AttachmentsMayBeMoreThanAnybodyWaitsFor) {
     loadTip(contents("A" + std::string(4000000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 5000));
     EXPECT_THAT(warnings(),
-                Contains(kest_log::warning("KestContentTexts.cpp", "__attach", "too much to attach: " + tipPath)));
+                Contains(kest_log::warning("KestTextGrowth.cpp", "attach", "too much to attach: " + tipPath)));
 }
