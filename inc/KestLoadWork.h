@@ -6,12 +6,15 @@
 /// What one load of the catalogue may still do, so that it ends on any input: files can refer to themselves, and
 /// any number of menus to the same file. A catalogue that is meant to be read needs a hundredth of it.
 /// Whoever asks for more than is left takes what is left: the load does not go on with many things that are refused.
+/// What takes longer than was thought ends by the clock: nothing is left after ten seconds of the processor's time.
 class KestLoadWork {
 public:
     KestLoadWork();
 
     /// What moving so many bytes of text costs, beside handling them.
     static std::uint64_t ofMoving(std::uint64_t bytes) { return bytes / 16; }
+    /// Where the text is full of what is nearly searched.
+    static std::uint64_t ofSearching(std::uint64_t bytes) { return bytes * 4; }
     /// A text is searched, looked up, marked up and copied so many times until it is translated.
     static std::uint64_t ofTranslating(std::uint64_t bytes) { return bytes * 32; }
 
@@ -26,6 +29,9 @@ public:
     bool keepsMore() const { return keptBytes > 0; }
 
 private:
+    bool __take(std::uint64_t& left, std::uint64_t amount) const;
+
+    std::int64_t begin;
     // More than a 32-bit device can count in a size_t.
     std::uint64_t textBytes;
     std::uint64_t detailTextBytes;

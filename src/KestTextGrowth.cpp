@@ -20,7 +20,7 @@ std::string KestTextGrowth::withAbsolutePaths(const std::string& text, const std
 void KestTextGrowth::attach(KestContentInfo& record, const std::string& placeholder, const std::string& fragment,
                             KestLoadWork& work) {
     const size_t size = record.textContents.size() + fragment.size();
-    if (size > KestXmlLimits::longestFile || !work.spendOnText(KestLoadWork::ofMoving(size))) {
+    if (size > KestXmlLimits::longestFile || !work.spendOnText(KestLoadWork::ofSearching(size))) {
         KEST_WARN("too much to attach: %s", record.path.c_str());
         return;
     }

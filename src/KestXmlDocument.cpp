@@ -3,6 +3,10 @@
 #include "KestFiles.h"
 #include "KestXmlLimits.h"
 
+#include <libxml/catalog.h>
+
+#include <algorithm>
+#include <cstring>
 #include <map>
 
 namespace {
@@ -11,6 +15,9 @@ const int recoverFromErrors = 1;
 
 /// More text than the entities of any file of a catalogue stand for.
 const size_t mostReferredText = 1024 * 1024;
+
+/// A file that is broken in thousands of places has fewer.
+const size_t mostMessageBytes = 16 * 1024 * 1024;
 
 /// What reading an element or a reference costs beside its text, in bytes of text.
 const size_t costOfNode = 16;
@@ -49,18 +56,18 @@ int closeText(void*) {
 bool giveTextsToParser() {
     // The parser asks the callbacks that were registered last first, so its own must be there already.
     xmlInitParser();
+    // Each catalog that a file names would be put at the end of a list which begins at its start.
+    xmlCatalogSetDefaults(XML_CATA_ALLOW_NONE);
     return xmlRegisterInputCallbacks(isForParser, openText, readText, closeText) >= 0;
 }
-
-void dropMessage(void*, xmlErrorPtr) {}
 
 /// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
 class Parsing {
 public:
-    explicit Parsing(const std::string& text) : current{text, 0} {
+    explicit Parsing(const std::string& text) : current{text, 0}, messageBytes(0) {
         static const bool given = giveTextsToParser();
         source = given ? &current : nullptr;
-        xmlSetStructuredErrorFunc(nullptr, dropMessage);
+        xmlSetStructuredErrorFunc(this, __dropMessage);
     }
     ~Parsing() {
         source = nullptr;
@@ -70,7 +77,20 @@ public:
     Parsing& operator=(const Parsing&) = delete;
 
 private:
+    /// A message quotes what it is about, all of it. The parser goes on after errors, but not after any number.
+    static void __dropMessage(void* data, xmlErrorPtr error) {
+        auto* parsing = static_cast<Parsing*>(data);
+        for (const char* text : {error->message, error->str1, error->str2, error->str3}) {
+            parsing->messageBytes += text ? std::strlen(text) : 0;
+        }
+        const bool hasParser = error->domain == XML_FROM_PARSER || error->domain == XML_FROM_NAMESPACE;
+        if (parsing->messageBytes > mostMessageBytes && hasParser && error->ctxt) {
+            xmlStopParser(static_cast<xmlParserCtxtPtr>(error->ctxt));
+        }
+    }
+
     Source current;
+    size_t messageBytes;
 };
 
 /// How much text the entities stand for that a document refers to. A few kilobytes of nested declarations can stand
@@ -143,12 +163,21 @@ bool readText(const std::string& path, KestLoadWork& work, std::string& text) {
            KestFiles::read(path, size, text) && KestXmlLimits::accept(text, weight) && work.spendOnFile(weight);
 }
 
+/// An encoding in it would make another text of the one that was judged.
+void dropDeclaration(std::string& text) {
+    const std::string begin = "<?xml";
+    if (text.compare(0, begin.size(), begin) == 0 && text.find_first_of(" \t\r\n", begin.size()) == begin.size()) {
+        text.erase(0, std::max(text.find('>'), begin.size()) + 1);
+    }
+}
+
 }  // namespace
 
 bool KestXmlDocument::read(const std::string& path, KestLoadWork& work) {
     document.reset();
     std::string text;
     if (readText(path, work, text)) {
+        dropDeclaration(text);
         const Parsing parsing(text);
         document.reset(xmlReadFile(path.c_str(), "utf-8", recoverFromErrors));
     }

@@ -25,6 +25,10 @@ std::uint64_t comparisonsOf(std::uint64_t attributes) {
     return attributes * attributes / 2;
 }
 
+/// The parser takes no deeper nesting. Where there are namespaces it looks for that of a name in each element around
+/// it.
+const std::uint64_t deepest = 256;
+
 /// Counts what the parser compares: the attributes of each tag with each other, and the names of tags and attributes
 /// with the namespaces in force.
 /// Nothing is taken for a comment or a section: where one ends the parser, which goes on after errors, may see it
@@ -43,7 +47,10 @@ public:
         return tags <= mostTags;
     }
 
-    std::uint64_t inAll() const { return ofAttributes + namespaces * (tags + attributesInAll); }
+    std::uint64_t inAll() const {
+        const std::uint64_t ofName = namespaces > 0 ? namespaces + deepest : 0;
+        return ofAttributes + ofName * (tags + attributesInAll);
+    }
 
 private:
     /// From behind its "<"; where it ends.

@@ -10,12 +10,12 @@ using namespace preference_calls;
 
 TEST_F(Cache, IsNotWrittenForATipWhoseFileGoesDuringTheLoad) {
     writeTip("<title>Title</title>");
-    const auto file = resources() / tipPath;
-    meanwhile["KestCurrentLanguage"] = [&file] { std::filesystem::remove(file); };
+    const auto tip = resources() / tipPath;
+    meanwhile["KestCurrentLanguage"] = [&tip] { std::filesystem::remove(tip); };
     const auto records = load();
     ASSERT_EQ(records.size(), 1U);
     EXPECT_EQ(records[0].menuTitle, "");
-    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + file.string())));
+    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + tip.string())));
     EXPECT_THAT(log(), Contains(info("loadContentsList", "__loadDetailMenu failed : " + kest)));
     EXPECT_EQ(preference("contents_tip.xml_menuTitle"), std::nullopt);
 }
@@ -25,10 +25,10 @@ TEST_F(Cache, OfATipHasTheStringsOfOneBeforeItWhoseFileWentDuringTheLoad) {
     writeDetail("<title>Gone</title>");
     writeStrings({{"en", "IDS_MINE", "Mine"}});
     writeDetail("<title id=\"IDS_MINE\">untranslated</title>", "contents/other.xml");
-    const auto file = resources() / tipPath;
-    meanwhile["KestCurrentLanguage"] = [&file] { std::filesystem::remove(file); };
+    const auto tip = resources() / tipPath;
+    meanwhile["KestCurrentLanguage"] = [&tip] { std::filesystem::remove(tip); };
     EXPECT_EQ(load().at(1).menuTitle, "Mine");
-    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + file.string())));
+    EXPECT_THAT(errors(), ElementsAre(error("__loadDetailMenu", "Failed to access: -1, " + tip.string())));
 }
 
 TEST_F(Cache, IsWrittenFieldByFieldAfterEachTip) {

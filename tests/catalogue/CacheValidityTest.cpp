@@ -1,7 +1,6 @@
 #include "CacheTest.h"
 
 using namespace manager_log;
-using kest_files::contents;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::Not;

@@ -75,3 +75,55 @@ TEST_F(HostileXml, MayHaveAMillionElements) {
                   .menuTitle,
               "Title");
 }
+
+TEST_F(HostileXml, IsNotParsedWithThousandsOfNamespacesThatEveryAttributeAsksFor) {
+    std::string attributes;
+    for (int i = 0; i < 100; ++i)
+        attributes += " z:a" + std::to_string(i) + "=''";
+    expectNotParsed(withNamespaces(3000, repeated("<x" + attributes + "/>", 3000)));
+}
+
+TEST_F(HostileXml, IsNotParsedWithMillionsOfElementsWhoseNamespaceIsFarAway) {
+    expectNotParsed("<tip xmlns='u' xmlns:p='v'>" + repeated("<p:a>", 253) + repeated("<a/>", 2900000));
+}
+
+TEST_F(HostileXml, MayHaveErrorsThatQuoteItAllEachTime) {
+    loadDetail("<tip><!--" + repeated("x -- ", 3000000) + "--></tip>");
+    loadDetail("<tip>" + repeated("<!--", 4000000) + "</tip>");
+    std::string attributes;
+    for (int i = 0; i < 400; ++i)
+        attributes += " p:a" + std::to_string(i) + "=''";
+    loadDetail("<tip>" + repeated("<" + std::string(49000, 'n') + attributes + "/>", 300) + "</tip>");
+}
+
+TEST_F(HostileXml, MayBeBrokenInThousandsOfPlaces) {
+    const std::string text = repeated("Black & white, ", 20000);
+    EXPECT_NE(
+        loadDetail("<tip><items><item><title>" + text + "</title><appname>App</appname></item></items></tip>").appName,
+        "");
+}
+
+TEST_F(HostileXml, MayNameCatalogsWithoutEnd) {
+    EXPECT_EQ(loadDetail(repeated("<?oasis-xml-catalog catalog=\"x\"?>", 300000) +
+                         "<tip><items><item><title>Title</title></item></items></tip>")
+                  .menuTitle,
+              "Title");
+}
+
+TEST_F(HostileXml, IsReadAsUtf8FarBehindADeclarationOfAnother) {
+    const std::string padding = "<!--" + std::string(9000, 'x') + "-->";
+    for (const char* begin : {"<?xml version='1.0' encoding='iso-8859-1'?>", "<?xml version='1.0' encoding='UTF-7'>",
+                              "<?xml\tencoding=\"utf-16\"?>", "<?xml version='1.0' encoding='utf-8'?>"})
+        EXPECT_EQ(
+            loadDetail(begin + padding + "<tip><items><item><title>caf\u00e9 +ACIAIg-</title></item></items></tip>")
+                .menuTitle,
+            "caf\u00e9 +ACIAIg-")
+            << begin;
+}
+
+TEST_F(HostileXml, MayBeADeclarationWithoutAnEnd) {
+    for (const char* text : {"<?xml version='1.0' encoding='UTF-7'", "<?xml "}) {
+        EXPECT_EQ(loadDetail(text).menuTitle, "");
+        EXPECT_THAT(errors(), testing::Contains(manager_log::error("__loadDetailMenu", "Empty document")));
+    }
+}

@@ -1,4 +1,6 @@
 #include "HostileTest.h"
+#include "PreferenceCalls.h"
+#include "ProcessorClock.h"
 
 using kest_files::contents;
 using kest_files::detail;
@@ -68,4 +70,17 @@ TEST_F(HostileMenus, ThatAreNotKeptHaveTheirIcons) {
 TEST_F(HostileMenus, MayShareContentsFullOfReferences) {
     writeShared(25, detail(contents(repeated("href=file:", 250000))));
     EXPECT_LE(sizeOf(load()), 64 * megabyte);
+}
+
+TEST_F(HostileMenus, AreLeftAsTheyAreOnceALoadHasTakenTooLong) {
+    writeMenus({{}, {"contents/other.xml"}});
+    writeDetail("<title>Title</title>");
+    writeDetail("<title>Other</title>", "contents/other.xml");
+    preference_calls::meanwhile["contents_tip.xml_menuTitle"] = [] { processor_clock::ahead = 11; };
+    const auto records = load();
+    processor_clock::ahead = 0;
+    preference_calls::meanwhile.clear();
+    EXPECT_EQ(records.at(1).menuTitle, "");
+    EXPECT_THAT(errors(), testing::ElementsAre(manager_log::error("__loadDetailMenu", "Failed to xmlReadFile")));
+    EXPECT_EQ(load().at(1).menuTitle, "Other");
 }

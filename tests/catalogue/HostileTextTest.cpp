@@ -241,15 +241,21 @@ TEST_F(HostileText, DomainsMayBeThousandsOfWhichTheFirstOnesCount) {
     EXPECT_EQ(loadTip(domains + last).menuTitle, "untranslated");
 }
 
-TEST_F(HostileText, AttachmentsMayBeTenThousand) {
-    EXPECT_EQ(loadTip(contents("A" + std::string(100000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 10000))
+TEST_F(HostileText, AttachmentsMayBeAThousand) {
+    EXPECT_EQ(loadTip(contents("A" + std::string(100000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 1000))
                   .textContents.size(),
-              110001U);
+              101001U);
     EXPECT_THAT(warnings(), testing::IsEmpty());
 }
 
 TEST_F(HostileText, AttachmentsMayBeMoreThanAnybodyWaitsFor) {
     loadTip(contents("A" + std::string(4000000, 'x')) + repeated("<attach id=\"A\">AA</attach>", 5000));
+    EXPECT_THAT(warnings(),
+                Contains(kest_log::warning("KestTextGrowth.cpp", "attach", "too much to attach: " + tipPath)));
+}
+
+TEST_F(HostileText, AttachmentsMayBeNearlyWhatTheContentsAreFullOf) {
+    loadTip(contents(std::string(8000000, 'a')) + repeated("<attach id=\"aaabaaaa\">x</attach>", 20000));
     EXPECT_THAT(warnings(),
                 Contains(kest_log::warning("KestTextGrowth.cpp", "attach", "too much to attach: " + tipPath)));
 }

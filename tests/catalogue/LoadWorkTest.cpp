@@ -1,5 +1,7 @@
 #include "KestLoadWork.h"
 
+#include "ProcessorClock.h"
+
 #include <gtest/gtest.h>
 
 namespace {
@@ -54,6 +56,20 @@ TEST(LoadWork, OnFilesIsAQuarterOfAGibibyte) {
     EXPECT_TRUE(work.spendOnFile(gibibyte / 4));
     work.beginDetail();
     EXPECT_FALSE(work.spendOnFile(1));
+}
+
+TEST(LoadWork, EndsAfterTenSecondsOfTheProcessorsTime) {
+    KestLoadWork work;
+    processor_clock::ahead = 9;
+    EXPECT_TRUE(work.spendOnText(0));
+    processor_clock::ahead = 11;
+    work.beginDetail();
+    EXPECT_FALSE(work.spendOnText(0));
+    EXPECT_FALSE(work.spendOnFile(0));
+    EXPECT_FALSE(work.spendOnKeeping(0));
+    KestLoadWork next;
+    EXPECT_TRUE(next.spendOnText(0)) << "another load has its own";
+    processor_clock::ahead = 0;
 }
 
 }  // namespace

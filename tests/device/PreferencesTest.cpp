@@ -105,6 +105,15 @@ TEST_F(FullDevice, IsGivenWhatItCouldNotKeepWhenItIsClosed) {
     EXPECT_EQ(device_->preferences().all(app).size(), 2U);
 }
 
+TEST_F(FullDevice, IsGivenNothingMoreAfterTheApplicationsEnd) {
+    failureOf("long", std::string(1 << 20, 'x'));
+    device_->preferences().finish();
+    EXPECT_THAT(device_->preferences().all(app), IsEmpty());
+    free();
+    device_.reopen();
+    EXPECT_THAT(device_->preferences().all(app), IsEmpty());
+}
+
 TEST_F(FullDevice, IsNotGivenWhatWasClearedMeanwhile) {
     failureOf("long", std::string(1 << 20, 'x'));
     device_->preferences().clear(app);
@@ -135,9 +144,12 @@ TEST(Preferences, ThatAnotherProcessKeptFromBeingWrittenAreWrittenLater) {
     EXPECT_EQ(messageOf([&] { device->preferences().setInOrder(app, "kept", "value"); }),
               device.root().string() +
                   "/device.db: is held by another process (database is locked); end that process and try again");
+    EXPECT_NE(messageOf([&] { device->preferences().setInOrder(app, "next", "value"); }), "");
+    EXPECT_EQ(device->database().sql().execAndGet("PRAGMA busy_timeout").getInt(), 5000)
+        << "the second one was tried without waiting, and only that";
     other.exec("COMMIT");
     device->preferences().setInOrder(app, "last", "value");
-    EXPECT_THAT(device->preferences().all(app), ElementsAre(Pair("kept", "value"), Pair("last", "value")));
+    EXPECT_EQ(device->preferences().all(app).size(), 3U);
 }
 
 }  // namespace

@@ -2,6 +2,7 @@
 #include <app-assist/WNaviframe.h>
 #include <app-assist/WView.h>
 #include <app-assist/WWindow.h>
+#include <dlog.h>
 
 #include <cstring>
 
@@ -27,6 +28,7 @@ class DrinksView : public app_assist::WView {
 
 class DrinksApp : public app_assist::WApp {
     bool onCreate() override {
+        dlog_print(DLOG_INFO, "SECOND", "created");
         attachWindow(new app_assist::WWindow("Drinks", ELM_WIN_BASIC));
         getWindow()->attachBaseUiObject(new app_assist::WNaviframe(), nullptr);
         return true;

@@ -220,6 +220,10 @@ TEST_F(SecondAppAlone, StartedTwiceSaysSoAndLeavesTheFirstAlone) {
     auto again = start();
     EXPECT_EQ(0, again->wait());
     EXPECT_EQ("second-app: " + std::string(second) + " is running already\n", again->said());
+    const std::string log = support::readFile(device::Folder(folder()).log());
+    const std::size_t created = log.find("created");
+    EXPECT_NE(std::string::npos, created);
+    EXPECT_EQ(std::string::npos, log.find("created", created + 1)) << "the second one made no application";
     EXPECT_EQ(0, app->terminate());
 }
 

@@ -122,6 +122,10 @@ bool Process::endsWithin(std::chrono::milliseconds time) const {
 }
 
 void Process::end() const {
+    if (id_ <= 0) {
+        throw device::Error(
+            "a process that cannot be seen from here, for example in a container, has to be ended there");
+    }
     kill(id_, SIGTERM);
     if (endsWithin(patience)) {
         return;

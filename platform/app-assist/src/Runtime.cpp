@@ -187,6 +187,8 @@ void Runtime::end() {
         guarded("onTerminate", [this] { app_.onTerminate(); });
     settings_.reset();
     presence_.reset();
+    if (device_)
+        device_->preferences().finish();
     instance_.reset();
     app_.window_.reset();
     UiTimers::endAll();

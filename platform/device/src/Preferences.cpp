@@ -71,12 +71,18 @@ void Preferences::forgetWaiting(const std::function<bool(const Write&)>& which) 
     });
 }
 
-Preferences::~Preferences() {
+void Preferences::finish() noexcept {
     try {
         writeWaiting();
     } catch (const std::exception&) {
         // It was said when it failed for the first time.
     }
+    waiting_.clear();
+    waitingBytes_ = 0;
+}
+
+Preferences::~Preferences() {
+    finish();
 }
 
 void Preferences::clear(const std::string& appId) {

@@ -20,7 +20,8 @@ public:
 
     bool isHeld() const { return held_; }
 
-    /// The other process that has the lock: the one that is the application; nullopt when none is.
+    /// The other process that has the lock: the one that is the application; nullopt when none is, 0 when it cannot be
+    /// seen from here (it runs in another process namespace).
     /// Not for a process that has the lock itself, which would lose it.
     static std::optional<pid_t> holder(const Folder& folder, const std::string& appId);
 
