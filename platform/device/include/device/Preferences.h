@@ -25,8 +25,9 @@ public:
     std::optional<std::string> get(const std::string& appId, const std::string& key) const;
     void set(const std::string& appId, const std::string& key, const std::string& value);
     /// For an application, whose values belong together: as set(), but nothing overtakes a write that failed. It is
-    /// tried again with the next one, without waiting for other processes, and by finish(), also when this is destroyed. A full disk
-    /// would else keep the short values and lose the long ones. After 4 MiB of failed writes nothing is written more.
+    /// tried again with the next one, without waiting for other processes, and by finish(), also when this is
+    /// destroyed. A full disk would else keep the short values and lose the long ones. After 4 MiB of failed writes
+    /// nothing is written more.
     void setInOrder(const std::string& appId, const std::string& key, const std::string& value);
     /// Writes what waits, or forgets it: before another process may be the application.
     void finish() noexcept;
