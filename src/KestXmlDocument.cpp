@@ -5,7 +5,6 @@
 
 #include <libxml/catalog.h>
 
-#include <algorithm>
 #include <cstring>
 #include <map>
 
@@ -31,6 +30,8 @@ void freeText(xmlChar* text) {
 struct Source {
     const std::string& text;
     size_t at;
+    /// As if the text ended here.
+    bool isCut;
 };
 Source* source = nullptr;
 
@@ -44,6 +45,9 @@ void* openText(const char*) {
 
 int readText(void* context, char* buffer, int length) {
     auto* from = static_cast<Source*>(context);
+    if (from->isCut) {
+        return 0;
+    }
     const size_t count = from->text.copy(buffer, static_cast<size_t>(length), from->at);
     from->at += count;
     return static_cast<int>(count);
@@ -64,7 +68,7 @@ bool giveTextsToParser() {
 /// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
 class Parsing {
 public:
-    explicit Parsing(const std::string& text) : current{text, 0}, messageBytes(0) {
+    explicit Parsing(const std::string& text) : current{text, 0, false}, messageBytes(0) {
         static const bool given = giveTextsToParser();
         source = given ? &current : nullptr;
         xmlSetStructuredErrorFunc(this, __dropMessage);
@@ -83,10 +87,8 @@ private:
         for (const char* text : {error->message, error->str1, error->str2, error->str3}) {
             parsing->messageBytes += text ? std::strlen(text) : 0;
         }
-        const bool hasParser = error->domain == XML_FROM_PARSER || error->domain == XML_FROM_NAMESPACE;
-        if (parsing->messageBytes > mostMessageBytes && hasParser && error->ctxt) {
-            xmlStopParser(static_cast<xmlParserCtxtPtr>(error->ctxt));
-        }
+        // The parser cannot be stopped from here: it goes on with what it has already read of the text.
+        parsing->current.isCut = parsing->messageBytes > mostMessageBytes;
     }
 
     Source current;
@@ -163,11 +165,14 @@ bool readText(const std::string& path, KestLoadWork& work, std::string& text) {
            KestFiles::read(path, size, text) && KestXmlLimits::accept(text, weight) && work.spendOnFile(weight);
 }
 
-/// An encoding in it would make another text of the one that was judged.
-void dropDeclaration(std::string& text) {
+/// An encoding in it would make another text of the one that was judged. With blanks in its place no other one can
+/// stand at the beginning, which is where the parser heeds it.
+void blankDeclaration(std::string& text) {
     const std::string begin = "<?xml";
     if (text.compare(0, begin.size(), begin) == 0 && text.find_first_of(" \t\r\n", begin.size()) == begin.size()) {
-        text.erase(0, std::max(text.find('>'), begin.size()) + 1);
+        const size_t end = text.find('>');
+        const size_t length = end == std::string::npos ? text.size() : end + 1;
+        text.replace(0, length, length, ' ');
     }
 }
 
@@ -177,7 +182,7 @@ bool KestXmlDocument::read(const std::string& path, KestLoadWork& work) {
     document.reset();
     std::string text;
     if (readText(path, work, text)) {
-        dropDeclaration(text);
+        blankDeclaration(text);
         const Parsing parsing(text);
         document.reset(xmlReadFile(path.c_str(), "utf-8", recoverFromErrors));
     }

@@ -85,6 +85,15 @@ TEST_F(Application, TheObjectIsTheProcesssForItsLife) {
     EXPECT_EQ(nullptr, WApp::getInstance());
 }
 
+TEST_F(Application, LeavesNoPreferenceToBeWrittenAfterItsEnd) {
+    RunningApp running(app_);
+    device_->database().sql().exec("PRAGMA max_page_count = 20");
+    EXPECT_ANY_THROW(device_->preferences().setInOrder("com.example.app", "long", std::string(1 << 20, 'x')));
+    device_->database().sql().exec("PRAGMA max_page_count = 10000");
+    running.end();
+    EXPECT_NE(device_->preferences().get("com.example.app", "long"), std::nullopt);
+}
+
 TEST_F(Application, MayEndInItsFirstLaunchRequest) {
     app_.inAppControl = [] { elm_exit(); };
     RunningApp running(app_);

@@ -96,6 +96,15 @@ TEST_F(HostileXml, MayHaveErrorsThatQuoteItAllEachTime) {
     loadDetail("<tip>" + repeated("<" + std::string(49000, 'n') + attributes + "/>", 300) + "</tip>");
 }
 
+TEST_F(HostileXml, MayHaveErrorsWithoutEndBehindALongValue) {
+    const std::string begin = "<a x='" + std::string(3000000, 'y') + "'>";
+    loadDetail(begin + repeated("]]>", 600000) + "</a>");
+    loadDetail(begin + repeated("<p:b/>", 300000) + "</a>");
+    loadDetail(begin + repeated("&nothing;", 300000) + "</a>");
+    loadDetail(begin + repeated("</c>", 600000) + "</a>");
+    loadDetail(begin + "<!--" + repeated("x -- ", 600000) + "--></a>");
+}
+
 TEST_F(HostileXml, MayBeBrokenInThousandsOfPlaces) {
     const std::string text = repeated("Black & white, ", 20000);
     EXPECT_NE(
@@ -112,8 +121,10 @@ TEST_F(HostileXml, MayNameCatalogsWithoutEnd) {
 
 TEST_F(HostileXml, IsReadAsUtf8FarBehindADeclarationOfAnother) {
     const std::string padding = "<!--" + std::string(9000, 'x') + "-->";
-    for (const char* begin : {"<?xml version='1.0' encoding='iso-8859-1'?>", "<?xml version='1.0' encoding='UTF-7'>",
-                              "<?xml\tencoding=\"utf-16\"?>", "<?xml version='1.0' encoding='utf-8'?>"})
+    for (const char* begin :
+         {"<?xml version='1.0' encoding='iso-8859-1'?>", "<?xml version='1.0' encoding='UTF-7'>",
+          "<?xml\tencoding=\"utf-16\"?>", "<?xml version='1.0' encoding='utf-8'?>",
+          "<?xml ?><?xml version='1.0' encoding='UTF-7'?>", "<?xml ?>\n<?xml version='1.0' encoding='UTF-7'?>"})
         EXPECT_EQ(
             loadDetail(begin + padding + "<tip><items><item><title>caf\u00e9 +ACIAIg-</title></item></items></tip>")
                 .menuTitle,
@@ -121,8 +132,9 @@ TEST_F(HostileXml, IsReadAsUtf8FarBehindADeclarationOfAnother) {
             << begin;
 }
 
-TEST_F(HostileXml, MayBeADeclarationWithoutAnEnd) {
-    for (const char* text : {"<?xml version='1.0' encoding='UTF-7'", "<?xml "}) {
+TEST_F(HostileXml, MayBeNothingButADeclaration) {
+    for (const char* text : {"<?xml version='1.0' encoding='UTF-7'", "<?xml ", "<?xml version='1.0'?>",
+                             "<?xml version='1.0' encoding='utf-8'?>\n"}) {
         EXPECT_EQ(loadDetail(text).menuTitle, "");
         EXPECT_THAT(errors(), testing::Contains(manager_log::error("__loadDetailMenu", "Empty document")));
     }
