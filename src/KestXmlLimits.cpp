@@ -17,6 +17,9 @@ const std::uint64_t heaviest = 64 * 1024 * 1024;
 /// A comparison takes a third of the time that a byte of text does.
 const std::uint64_t comparisonsOfByte = 2;
 
+/// So many bytes are copied, and measured, while one is parsed.
+const std::uint64_t copiesOfByte = 8;
+
 /// The shortest attribute: a blank, a letter, "=" and two quotes.
 const std::uint64_t shortestAttribute = 5;
 
@@ -86,6 +89,21 @@ private:
     std::uint64_t ofAttributes = 0;
 };
 
+/// A "--" in a comment is an error whose message quotes the comment so far, all of it. No comment began before the last
+/// "-->", wherever the parser sees comments.
+std::uint64_t bytesQuotedFromComments(const std::string& text) {
+    std::uint64_t bytes = 0;
+    size_t begin = 0;
+    for (size_t at = text.find("--"); at != std::string::npos; at = text.find("--", at + 1)) {
+        if (at + 2 < text.size() && text[at + 2] == '>') {
+            begin = at + 3;
+        } else {
+            bytes += at - begin;
+        }
+    }
+    return bytes;
+}
+
 bool hasDocumentType(const std::string& text) {
     return KestMarkup::find(text, "<!DOCTYPE", 0) != std::string::npos;
 }
@@ -120,6 +138,6 @@ bool KestXmlLimits::accept(const std::string& text, std::uint64_t& weight) {
     }
     Comparisons comparisons(text);
     const bool readable = comparisons.count();
-    weight = comparisons.inAll() / comparisonsOfByte;
+    weight = comparisons.inAll() / comparisonsOfByte + bytesQuotedFromComments(text) / copiesOfByte;
     return readable && weight <= heaviest;
 }

@@ -105,6 +105,15 @@ TEST_F(HostileXml, MayHaveErrorsWithoutEndBehindALongValue) {
     loadDetail(begin + "<!--" + repeated("x -- ", 600000) + "--></a>");
 }
 
+TEST_F(HostileXml, IsNotParsedWithManyDashesBehindALongComment) {
+    const std::string title = "<items><item><title>Title</title></item></items></tip>";
+    expectNotParsed("<tip><!--" + std::string(9000000, 'x') + std::string(20000, '-') + "-->" + title);
+    EXPECT_EQ(
+        loadDetail("<tip><!--" + std::string(9000000, 'x') + " -- " + std::string(20, '-') + "-->" + title).menuTitle,
+        "Title");
+    EXPECT_EQ(loadDetail("<tip>" + repeated("<!-- a - b -->", 500000) + title).menuTitle, "Title");
+}
+
 TEST_F(HostileXml, MayBeBrokenInThousandsOfPlaces) {
     const std::string text = repeated("Black & white, ", 20000);
     EXPECT_NE(
