@@ -2,6 +2,7 @@
 
 #include "KestMarkup.h"
 
+#include <algorithm>
 #include <cctype>
 
 namespace {
@@ -89,16 +90,23 @@ private:
     std::uint64_t ofAttributes = 0;
 };
 
-/// A "--" in a comment is an error whose message quotes the comment so far, all of it. No comment began before the last
-/// "-->", wherever the parser sees comments.
+/// A "--" in a comment is an error whose message quotes the comment so far, all of it. Two dashes and a ">" end it in
+/// every case; whether more dashes do is a matter of how the parser pairs them.
 std::uint64_t bytesQuotedFromComments(const std::string& text) {
     std::uint64_t bytes = 0;
-    size_t begin = 0;
-    for (size_t at = text.find("--"); at != std::string::npos; at = text.find("--", at + 1)) {
-        if (at + 2 < text.size() && text[at + 2] == '>') {
-            begin = at + 3;
+    size_t begin = std::string::npos;
+    size_t end = 0;
+    for (size_t at = text.find("--"); at != std::string::npos; at = text.find("--", end)) {
+        end = std::min(text.find_first_not_of('-', at), text.size());
+        const bool opens = at >= 2 && text.compare(at - 2, 2, "<!") == 0;
+        const size_t dashes = end - at - (opens ? 2 : 0);
+        const bool closes = dashes == 2 && end < text.size() && text[end] == '>';
+        if (begin == std::string::npos) {
+            begin = opens && !closes ? at : begin;
+        } else if (closes && !opens) {
+            begin = std::string::npos;
         } else {
-            bytes += at - begin;
+            bytes += std::uint64_t{end - at} * (end - begin);
         }
     }
     return bytes;

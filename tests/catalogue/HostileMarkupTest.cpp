@@ -111,7 +111,9 @@ TEST_F(HostileXml, IsNotParsedWithManyDashesBehindALongComment) {
     EXPECT_EQ(
         loadDetail("<tip><!--" + std::string(9000000, 'x') + " -- " + std::string(20, '-') + "-->" + title).menuTitle,
         "Title");
+    expectNotParsed("<tip><!--" + std::string(9000000, 'x') + repeated("x--->", 20000) + "-->" + title);
     EXPECT_EQ(loadDetail("<tip>" + repeated("<!-- a - b -->", 500000) + title).menuTitle, "Title");
+    EXPECT_EQ(loadDetail("<tip>" + repeated("a text -- with dashes ", 400000) + title).menuTitle, "Title");
 }
 
 TEST_F(HostileXml, MayBeBrokenInThousandsOfPlaces) {
