@@ -8,8 +8,8 @@ public:
     /// Where `what` occurs in the text at `from` or after it, else std::string::npos. Unlike std::string's own search
     /// it stays linear where the text is full of beginnings of what is searched.
     static size_t find(const std::string& text, const std::string& what, size_t from);
-    /// How often it occurs, one after the other.
-    static size_t count(const std::string& text, const std::string& what);
+    /// How often it occurs there, one after the other.
+    static size_t count(const std::string& text, const std::string& what, size_t from = 0);
     /// Replaces `from` by `to`, the first time or every time that it occurs; what is put in is not searched again.
     static std::string replaceString(const std::string& text, const std::string& from, const std::string& to,
                                      bool firstOnly);

@@ -25,7 +25,6 @@ public:
     const std::string& result() const { return contents; }
 
 private:
-    size_t __countOccurrences() const;
     void __replaceAll(const std::string& value);
 
     std::string contents;

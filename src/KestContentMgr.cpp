@@ -158,6 +158,7 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
 }
 
 void KestContentMgr::__keep(KestContentInfo& record) {
+    // What is kept is charged by its length; what the replacements left reserved could be as much again.
     record.textContents.shrink_to_fit();
     if (!work.spendOnKeeping(KestContentCache::sizeOf(record))) {
         KEST_WARN("too much text: %s", record.path.c_str());

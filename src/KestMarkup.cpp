@@ -7,9 +7,9 @@ size_t KestMarkup::find(const std::string& text, const std::string& what, size_t
     return found ? static_cast<size_t>(static_cast<const char*>(found) - text.data()) : std::string::npos;
 }
 
-size_t KestMarkup::count(const std::string& text, const std::string& what) {
+size_t KestMarkup::count(const std::string& text, const std::string& what, size_t from) {
     size_t count = 0;
-    for (size_t at = find(text, what, 0); at != std::string::npos; at = find(text, what, at + what.size())) {
+    for (size_t at = find(text, what, from); at != std::string::npos; at = find(text, what, at + what.size())) {
         ++count;
     }
     return count;

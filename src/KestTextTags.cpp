@@ -32,19 +32,11 @@ std::string KestTextTags::first() {
     return tag;
 }
 
-size_t KestTextTags::__countOccurrences() const {
-    size_t count = 0;
-    for (size_t at = begin; at != std::string::npos; at = KestMarkup::find(contents, tag, at + tag.size())) {
-        ++count;
-    }
-    return count;
-}
-
 bool KestTextTags::replaceFirst(const std::string& value) {
-    const size_t count = __countOccurrences();
-    if (count == 0 || replacements == mostReplacements) {
+    if (begin == std::string::npos || replacements == mostReplacements) {
         return false;
     }
+    const size_t count = KestMarkup::count(contents, tag, begin);
     const size_t kept = contents.size() - count * tag.size();
     if (contents.size() > longestContents || value.size() > (longestContents - kept) / count) {
         return false;

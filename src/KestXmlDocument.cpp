@@ -158,7 +158,7 @@ void removeReferences(xmlNode* first) {
 
 /// The text of a file that may be parsed. Its work is taken before it is done: also many files that are refused in the
 /// end come to an end.
-bool readText(const std::string& path, KestLoadWork& work, std::string& text) {
+bool readAcceptedText(const std::string& path, KestLoadWork& work, std::string& text) {
     size_t size = 0;
     std::uint64_t weight = 0;
     return KestFiles::sizeOf(path, size) && size <= KestXmlLimits::longestFile && work.spendOnFile(size) &&
@@ -181,7 +181,7 @@ void blankDeclaration(std::string& text) {
 bool KestXmlDocument::read(const std::string& path, KestLoadWork& work) {
     document.reset();
     std::string text;
-    if (readText(path, work, text)) {
+    if (readAcceptedText(path, work, text)) {
         blankDeclaration(text);
         const Parsing parsing(text);
         document.reset(xmlReadFile(path.c_str(), "utf-8", recoverFromErrors));

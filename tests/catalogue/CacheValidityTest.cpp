@@ -6,6 +6,16 @@ using testing::ElementsAre;
 using testing::Not;
 using namespace preference_calls;
 
+namespace {
+
+/// The log of a load from the files that says why it does not use the cache.
+auto isLogOfLoadBecauseOf(const char* reason) {
+    return ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"), info("__checkCacheAvailable", reason),
+                       begin("__loadDetailMenu"), begin("__loadStringResource"), hit("__saveToPreference"));
+}
+
+}  // namespace
+
 TEST_F(Cache, IsNotUsedWhenALoadIsForced) {
     fill();
     writeDetail("<title>Changed</title>");
@@ -26,9 +36,7 @@ TEST_F(Cache, IsInvalidForAnotherLanguage) {
     fill();
     setLanguage("ko_KR.UTF-8");
     loadAtNextStart();
-    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
-                                   info("__checkCacheAvailable", "Language changed"), begin("__loadDetailMenu"),
-                                   begin("__loadStringResource"), hit("__saveToPreference")));
+    EXPECT_THAT(log(), isLogOfLoadBecauseOf("Language changed"));
     EXPECT_EQ(preference("KestCurrentLanguage"), "ko_KR.UTF-8");
 }
 
@@ -52,9 +60,7 @@ TEST_F(Cache, IsInvalidForAnotherVersion) {
     fill();
     upgradeTo("1.0.1");
     loadAtNextStart();
-    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"),
-                                   info("__checkCacheAvailable", "Version changed!!"), begin("__loadDetailMenu"),
-                                   begin("__loadStringResource"), hit("__saveToPreference")));
+    EXPECT_THAT(log(), isLogOfLoadBecauseOf("Version changed!!"));
     EXPECT_EQ(preference("KestPackageVersion"), "1.0.1");
 }
 

@@ -38,13 +38,12 @@ std::set<std::string> knownIds(device::Device& device) {
 }
 
 /// Those that answer on the bus and belong to this device.
-void addThoseOnBus(Session& session, std::vector<RunningApplication>& running) {
+void addThoseOnBus(Session& session, const std::set<std::string>& known, std::vector<RunningApplication>& running) {
     const device::Bus* bus = session.bus();
     if (!bus) {
         return;
     }
     const std::string ours = session.folder().root();
-    const std::set<std::string> known = knownIds(session.device());
     for (const std::string& name : device::BusName::all(*bus)) {
         if (!known.contains(name) || folderOf(*bus, name) != ours) {
             continue;
@@ -56,8 +55,9 @@ void addThoseOnBus(Session& session, std::vector<RunningApplication>& running) {
 }
 
 /// The others: those that run without the bus, and those that hang.
-void addThoseThatDoNotAnswer(Session& session, std::vector<RunningApplication>& running) {
-    for (const std::string& id : knownIds(session.device())) {
+void addThoseThatDoNotAnswer(Session& session, const std::set<std::string>& known,
+                             std::vector<RunningApplication>& running) {
+    for (const std::string& id : known) {
         const bool answers = std::any_of(running.begin(), running.end(),
                                          [&](const RunningApplication& application) { return application.id == id; });
         if (answers) {
@@ -82,8 +82,9 @@ std::string nameOf(const RunningApplication& application) {
 
 std::vector<RunningApplication> runningApplications(Session& session) {
     std::vector<RunningApplication> running;
-    addThoseOnBus(session, running);
-    addThoseThatDoNotAnswer(session, running);
+    const std::set<std::string> known = knownIds(session.device());
+    addThoseOnBus(session, known, running);
+    addThoseThatDoNotAnswer(session, known, running);
     std::stable_sort(running.begin(), running.end(), [](const auto& a, const auto& b) { return a.id < b.id; });
     return running;
 }

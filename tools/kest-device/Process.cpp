@@ -27,16 +27,6 @@ fs::path procFolder(int id) {
     return fs::path("/proc") / std::to_string(id);
 }
 
-/// A list of texts, each ended by a zero byte, as the kernel hands them out.
-std::vector<std::string> zeroEnded(const fs::path& file) {
-    std::ifstream stream(file, std::ios::binary);
-    std::vector<std::string> texts;
-    for (std::string text; std::getline(stream, text, '\0');) {
-        texts.push_back(text);
-    }
-    return texts;
-}
-
 std::vector<std::string> environmentWith(const std::vector<std::pair<std::string, std::string>>& changes) {
     std::vector<std::string> all;
     for (char** entry = environ; *entry; ++entry) {
@@ -92,22 +82,14 @@ bool Process::runs() const {
     return name != std::string::npos && stat[name + 2] != 'Z' && stat[name + 2] != 'X';
 }
 
-fs::path Process::executable() const {
-    std::error_code error;
-    return fs::read_symlink(procFolder(id_) / "exe", error);
-}
-
 std::vector<std::string> Process::arguments() const {
-    return zeroEnded(procFolder(id_) / "cmdline");
-}
-
-std::optional<std::string> Process::environment(const std::string& variable) const {
-    for (const std::string& entry : zeroEnded(procFolder(id_) / "environ")) {
-        if (entry.starts_with(variable + "=")) {
-            return entry.substr(variable.size() + 1);
-        }
+    std::ifstream stream(procFolder(id_) / "cmdline", std::ios::binary);
+    std::vector<std::string> words;
+    // The kernel ends each with a zero byte.
+    for (std::string word; std::getline(stream, word, '\0');) {
+        words.push_back(word);
     }
-    return std::nullopt;
+    return words;
 }
 
 bool Process::endsWithin(std::chrono::milliseconds time) const {

@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace tool {
@@ -13,18 +14,11 @@ class Process {
 public:
     explicit Process(int id) : id_(id) {}
 
-    /// All processes of this user that have `variable` set to `value` in the environment that they were started with.
-    static std::vector<Process> withEnvironment(const std::string& variable, const std::string& value);
-
     int id() const { return id_; }
     /// False as soon as it has ended, also while its parent has not noticed yet.
     bool runs() const;
-    /// Its executable; empty when it cannot be told.
-    std::filesystem::path executable() const;
     /// Its words, the program's name first; empty when they cannot be told.
     std::vector<std::string> arguments() const;
-    /// A variable of the environment that it was started with.
-    std::optional<std::string> environment(const std::string& variable) const;
 
     /// Whether it ended within that time.
     bool endsWithin(std::chrono::milliseconds time) const;

@@ -6,14 +6,13 @@
 
 #include <cerrno>
 #include <fcntl.h>
-#include <unistd.h>
 
 namespace device {
 namespace {
 
-int openLockFile(const std::filesystem::path& file) {
-    const int descriptor = open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600);
-    if (descriptor < 0)
+Descriptor openLockFile(const std::filesystem::path& file) {
+    Descriptor descriptor(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0600));
+    if (!descriptor)
         throw Error(file.string() + ": " + reasonOf(errno) + "; make the device's folder writable");
     return descriptor;
 }
@@ -34,11 +33,7 @@ bool take(int descriptor) {
 }  // namespace
 
 ApplicationLock::ApplicationLock(const Folder& folder, const std::string& appId)
-    : descriptor_(openLockFile(folder.applicationLock(appId))), held_(take(descriptor_)) {}
-
-ApplicationLock::~ApplicationLock() {
-    close(descriptor_);
-}
+    : file_(openLockFile(folder.applicationLock(appId))), held_(take(file_.get())) {}
 
 std::optional<pid_t> ApplicationLock::holder(const Folder& folder, const std::string& appId) {
     const Descriptor file(open(folder.applicationLock(appId).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOFOLLOW));

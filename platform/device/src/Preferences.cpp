@@ -2,7 +2,7 @@
 
 #include "device/Database.h"
 
-#include <utility>
+#include <numeric>
 
 namespace device {
 namespace {
@@ -37,10 +37,11 @@ void Preferences::setInOrder(const std::string& appId, const std::string& key, c
         writeWaiting();
         set(appId, key, value);
     } catch (const Error& failure) {
-        keepWaiting({appId, key, value});
+        waiting_.push_back({appId, key, value});
+        waitingBytes_ += waiting_.back().size();
         if (waitingBytes_ > mostWaitingBytes) {
             failure_ = failure;
-            forgetWaiting([](const Write&) { return true; });
+            forgetWaiting();
         }
         throw;
     }
@@ -58,17 +59,9 @@ void Preferences::writeWaiting() {
     }
 }
 
-void Preferences::keepWaiting(Write write) {
-    waitingBytes_ += write.size();
-    waiting_.push_back(std::move(write));
-}
-
-void Preferences::forgetWaiting(const std::function<bool(const Write&)>& which) {
-    std::erase_if(waiting_, [&](const Write& write) {
-        const bool forgotten = which(write);
-        waitingBytes_ -= forgotten ? write.size() : 0;
-        return forgotten;
-    });
+void Preferences::forgetWaiting() {
+    waiting_.clear();
+    waitingBytes_ = 0;
 }
 
 void Preferences::finish() noexcept {
@@ -77,8 +70,7 @@ void Preferences::finish() noexcept {
     } catch (const std::exception&) {
         // It was said when it failed for the first time.
     }
-    waiting_.clear();
-    waitingBytes_ = 0;
+    forgetWaiting();
 }
 
 Preferences::~Preferences() {
@@ -86,12 +78,14 @@ Preferences::~Preferences() {
 }
 
 void Preferences::clear(const std::string& appId) {
-    forgetWaiting([&](const Write& write) { return write.appId == appId; });
+    std::erase_if(waiting_, [&](const Write& write) { return write.appId == appId; });
+    waitingBytes_ = std::accumulate(waiting_.begin(), waiting_.end(), std::size_t{0},
+                                    [](std::size_t bytes, const Write& write) { return bytes + write.size(); });
     database_.guarded([&] { database_.query("DELETE FROM preference WHERE app_id = ?", appId)->exec(); });
 }
 
 void Preferences::clearAll() {
-    forgetWaiting([](const Write&) { return true; });
+    forgetWaiting();
     database_.guarded([&] { database_.query("DELETE FROM preference")->exec(); });
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "device/Descriptor.h"
+
 #include <optional>
 #include <string>
 #include <sys/types.h>
@@ -14,9 +16,6 @@ class ApplicationLock {
 public:
     /// Takes the application's lock, unless another process has it. Throws Error when its file cannot be made.
     ApplicationLock(const Folder& folder, const std::string& appId);
-    ~ApplicationLock();
-    ApplicationLock(const ApplicationLock&) = delete;
-    ApplicationLock& operator=(const ApplicationLock&) = delete;
 
     bool isHeld() const { return held_; }
 
@@ -26,7 +25,7 @@ public:
     static std::optional<pid_t> holder(const Folder& folder, const std::string& appId);
 
 private:
-    int descriptor_;
+    Descriptor file_;
     bool held_;
 };
 

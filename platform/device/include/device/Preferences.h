@@ -4,7 +4,6 @@
 
 #include <cstddef>
 #include <deque>
-#include <functional>
 #include <map>
 #include <optional>
 #include <string>
@@ -47,8 +46,7 @@ private:
     };
 
     void writeWaiting();
-    void keepWaiting(Write write);
-    void forgetWaiting(const std::function<bool(const Write&)>& which);
+    void forgetWaiting();
 
     Database& database_;
     std::deque<Write> waiting_;
