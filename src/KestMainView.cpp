@@ -53,6 +53,7 @@ Evas_Object* KestMainView::onCreate(Evas_Object* parent, void*) {
     expand(layout);
 
     __genlist = __createGenlist(layout);
+    // __createGenlist() does not return without one.
     if (!__genlist) {
         KEST_INFO("genlist is null");
     }

@@ -29,6 +29,11 @@ std::string languageOfTexts() {
 class DeviceChange : public test_ui::UiTest {
 protected:
     void set(const char* key, const char* value) { device_->settings().set(key, value); }
+    /// As another process does of which this one hears nothing.
+    void setUnheard(const char* key, const char* value) {
+        device::Device other(device_.options());
+        other.settings().set(key, value);
+    }
 
     support::TemporaryDevice device_;
     TellingApp app_;
@@ -61,6 +66,38 @@ TEST_F(DeviceChange, ALanguageChangeReachesTheLocaleFirstAndThenTheHandlers) {
     set(device::keys::language, "ko_KR.UTF-8");
     set(device::keys::country, "IN");
     EXPECT_THAT(languages, ElementsAre("ko_KR"));
+}
+
+TEST_F(DeviceChange, WhileTheApplicationStartsIsCaughtUpWith) {
+    Story changes;
+    WAppEventHandler handler;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [&](app_event_info_h, void*) { changes.push_back(languageOfTexts()); }, nullptr);
+    const uxt_theme_changed_cb tell = [](void* data) { static_cast<Story*>(data)->push_back("theme"); };
+    uxt_theme_add_changed_callback(nullptr, tell, &changes);
+    app_.inCreate = [this] {
+        setUnheard(device::keys::language, "ko_KR.UTF-8");
+        setUnheard(device::keys::theme, "dark");
+    };
+    app_.inAppControl = [&changes] { changes.push_back("request"); };
+    RunningApp running(app_);
+    test_ui::runFor(0.1);
+    EXPECT_THAT(changes, ElementsAre("ko_KR", "theme", "request"));
+    uxt_theme_delete_changed_callback(nullptr, tell);
+}
+
+TEST_F(DeviceChange, ThatWasNoneIsNotToldOf) {
+    WAppEventHandler handler;
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED, [](app_event_info_h, void*) { FAIL(); }, nullptr);
+    const uxt_theme_changed_cb never = [](void*) { FAIL(); };
+    uxt_theme_add_changed_callback(nullptr, never, nullptr);
+    set(device::keys::language, "ko_KR.UTF-8");
+    set(device::keys::theme, "dark");
+    RunningApp running(app_);
+    test_ui::runFor(0.1);
+    EXPECT_EQ("ko_KR", languageOfTexts());
+    uxt_theme_delete_changed_callback(nullptr, never);
 }
 
 TEST_F(DeviceChange, AHandlerMayDestroyItselfAndOthersWhileItRuns) {

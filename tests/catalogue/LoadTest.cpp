@@ -1,5 +1,7 @@
 #include "CatalogueTest.h"
 
+#include <libxml/parser.h>
+
 #include <cstdlib>
 
 using namespace manager_log;
@@ -128,6 +130,17 @@ TEST_F(Load, LeavesTheLanguageMarkWhenTheDeviceNamesNone) {
     writeTip("<title>A</title>");
     load();
     EXPECT_EQ(preference("KestCurrentLanguage"), "ru_RU.UTF-8");
+}
+
+TEST_F(Load, GivesTheParserBackToTheRestOfTheProcess) {
+    writeTip("<title>A</title>");
+    load();
+    EXPECT_EQ(xmlStructuredError, nullptr) << "messages about other files are not the catalogue's";
+    const std::filesystem::path other = resources() / "other.xml";
+    support::writeFile(other, "<other/>");
+    const std::unique_ptr<xmlDoc, decltype(&xmlFreeDoc)> document(xmlReadFile(other.c_str(), nullptr, 0), xmlFreeDoc);
+    ASSERT_NE(document, nullptr);
+    EXPECT_STREQ(reinterpret_cast<const char*>(xmlDocGetRootElement(document.get())->name), "other");
 }
 
 /// Ends the process as a finished application does, with the log on standard error.

@@ -90,6 +90,8 @@ TEST_F(Settings, ThatAreUnsetAreAsOnAFreshDevice) {
     for (const char* name : {"language", "theme", "screen"}) {
         device_.must({"unset", name});
     }
+    EXPECT_EQ(run({"get"}), done("language  en_US\nscreen    720x1280\ntheme     light\n"))
+        << "a setting that has no value is another thing to an application than the fresh device's value";
 
     EXPECT_EQ(device_.json({"status"}), fresh);
     EXPECT_EQ(run({"status"}), done("folder    " + root() +
@@ -98,12 +100,29 @@ TEST_F(Settings, ThatAreUnsetAreAsOnAFreshDevice) {
 }
 
 TEST_F(Settings, OfAScreenOrAThemeThatDoesNotExistAreToldAsTheDeviceTakesThem) {
-    device_.must({"set", device::keys::screen, "1x1"});
-    device_.must({"set", device::keys::theme, "pink"});
+    device_.open().settings().set(device::keys::screen, "1x1");
+    device_.open().settings().set(device::keys::theme, "pink");
 
     const nlohmann::json status = device_.json({"status"});
     EXPECT_EQ(status["screen"], "720x1280");
     EXPECT_EQ(status["theme"], "light");
+}
+
+TEST_F(Settings, HaveTheSameMeaningUnderTheirKeys) {
+    device_.open().preferences().set("com.example.one", "key", "value");
+
+    EXPECT_EQ(run({"set", device::keys::country, "IN"}), done());
+    EXPECT_EQ(run({"preferences"}), done());
+    EXPECT_EQ(run({"set", device::keys::country, "india"}),
+              failed("a country is two capital letters such as IN, or none; \"india\" is neither"));
+    EXPECT_EQ(run({"set", device::keys::theme, "pink"}), failed("there is no theme \"pink\"; there are light, dark"));
+    EXPECT_EQ(run({"set", device::keys::language, "ko_KR.UTF-8"}), done());
+    EXPECT_EQ(run({"get", "language"}), done("ko_KR\n"));
+    EXPECT_EQ(run({"unset", device::keys::language}), done());
+    EXPECT_EQ(run({"get", device::keys::language}), done("en_US.UTF-8\n"));
+    device_.open().preferences().set("com.example.one", "key", "value");
+    EXPECT_EQ(run({"unset", device::keys::country}), done());
+    EXPECT_EQ(run({"preferences"}), done());
 }
 
 TEST_F(Settings, AMistypedNameIsNotTakenForAKey) {

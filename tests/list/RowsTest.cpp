@@ -223,3 +223,14 @@ TEST_F(Rows, ShowTextsThatAreNoProperUnicode) {
     EXPECT_EQ(test_ui::rows(list()).size(), 2U);
     screen().picture();
 }
+
+TEST_F(Rows, WithoutDataAreErrorLines) {
+    writeTips({"A"});
+    start();
+    const Elm_Genlist_Item_Class& menu = *calls::made().rows.at(1).itemClass;
+    newLog();
+    EXPECT_EQ(menu.func.text_get(nullptr, list(), "elm.text.main.left.bottom"), nullptr);
+    EXPECT_EQ(menu.func.content_get(nullptr, list(), "elm.icon.1"), nullptr);
+    EXPECT_THAT(newLog(), ElementsAre(list_log::error("__getRowText", "data is null"),
+                                      list_log::error("__getRowContent", "data is null")));
+}

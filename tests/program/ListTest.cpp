@@ -43,7 +43,7 @@ TEST_F(TipsList, AnotherCountryAndARestartChangeWhichMenusShow) {
     EXPECT_THAT(global, SizeIs(menusOfferedIn("Global").size()));
 
     device_.must({"set", "country", "IN"});
-    EXPECT_EQ(titles(), global) << "a running list keeps its menus";
+    EXPECT_EQ(titles(), global) << "a running list keeps its menus until it loads anew";
     restart();
 
     EXPECT_THAT(titles(), SizeIs(menusOfferedIn("India").size()));

@@ -19,6 +19,10 @@ struct Name {
 
 constexpr std::array names{Name{"language", device::keys::language}, Name{"country", device::keys::country},
                            Name{"theme", device::keys::theme}, Name{"screen", device::keys::screen}};
+/// Of the settings that a fresh device has.
+const std::map<std::string, std::string> freshValues = {{"language", device::keys::defaultLanguage},
+                                                        {"theme", device::keys::defaultTheme},
+                                                        {"screen", device::keys::defaultScreen}};
 constexpr char codeset[] = ".UTF-8";
 constexpr char noCountry[] = "none";
 
@@ -75,6 +79,12 @@ void storeCountry(device::Device& device, const std::string& value) {
     }
 }
 
+/// The name that people use for a key that has one.
+std::string nameOf(const std::string& key) {
+    const auto known = std::find_if(names.begin(), names.end(), [&](const Name& name) { return name.key == key; });
+    return known == names.end() ? key : known->name;
+}
+
 /// As people write it: the language without its codeset.
 std::string forPeople(const std::string& key, const std::string& value) {
     return key == device::keys::language ? withoutCodeset(value) : value;
@@ -91,18 +101,13 @@ std::optional<std::string> readSetting(device::Device& device, const std::string
 std::map<std::string, std::string> readSettings(device::Device& device) {
     std::map<std::string, std::string> settings;
     for (const auto& setting : device.settings().all()) {
-        const auto known =
-            std::find_if(names.begin(), names.end(), [&](const Name& name) { return name.key == setting.first; });
-        if (known == names.end()) {
-            settings.insert(setting);
-        } else {
-            settings[known->name] = forPeople(setting.first, setting.second);
-        }
+        settings[nameOf(setting.first)] = forPeople(setting.first, setting.second);
     }
     return settings;
 }
 
-void storeSetting(device::Device& device, const std::string& name, const std::string& value) {
+void storeSetting(device::Device& device, const std::string& nameOrKey, const std::string& value) {
+    const std::string name = nameOf(nameOrKey);
     if (name == "language") {
         const std::string language = withoutCodeset(value);
         requireOneOf("language", language, device.languages());
@@ -120,9 +125,12 @@ void storeSetting(device::Device& device, const std::string& name, const std::st
     }
 }
 
-void removeSetting(device::Device& device, const std::string& name) {
+void removeSetting(device::Device& device, const std::string& nameOrKey) {
+    const std::string name = nameOf(nameOrKey);
     if (name == "country") {
         storeCountry(device, noCountry);
+    } else if (const auto fresh = freshValues.find(name); fresh != freshValues.end()) {
+        device.settings().set(keyOf(name), fresh->second);
     } else {
         device.settings().remove(keyOf(name));
     }

@@ -16,9 +16,10 @@ std::optional<std::string> readSetting(device::Device& device, const std::string
 /// All settings, by the names that people use where there is one.
 std::map<std::string, std::string> readSettings(device::Device& device);
 
-/// Checks the value and stores it. A change of country starts every application anew: it clears their preferences.
+/// Checks the value and stores it, as a name's also where its vconf key was given. A change of country starts every
+/// application anew: it clears their preferences.
 void storeSetting(device::Device& device, const std::string& name, const std::string& value);
-/// Removes the setting, as if it had never been set.
+/// Gives the setting what it has on a fresh device, or removes it where that has none.
 void removeSetting(device::Device& device, const std::string& name);
 
 }  // namespace tool

@@ -68,6 +68,7 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
         }
         if (const auto status = joinBus())
             return status;
+        catchUp();
         queueFirstRequest();
         return std::nullopt;
     } catch (const std::exception& error) {
@@ -171,12 +172,21 @@ void Runtime::settingChanged(const std::string& key) {
     }
 }
 
-void Runtime::useLanguage() const {
-    DisplayLanguage(device_->language()).use();
+void Runtime::catchUp() {
+    if (device_->language() != language_)
+        settingChanged(device::keys::language);
+    if (device_->isDark() != isDark_)
+        settingChanged(device::keys::theme);
 }
 
-void Runtime::useTheme() const {
-    uxt::applyDeviceTheme(device_->isDark());
+void Runtime::useLanguage() {
+    language_ = device_->language();
+    DisplayLanguage(language_).use();
+}
+
+void Runtime::useTheme() {
+    isDark_ = device_->isDark();
+    uxt::applyDeviceTheme(isDark_);
 }
 
 void Runtime::end() {

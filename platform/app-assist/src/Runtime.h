@@ -40,8 +40,10 @@ private:
     void deliver(const LaunchRequest::Extras& extras);
     void followDevice();
     void settingChanged(const std::string& key);
-    void useLanguage() const;
-    void useTheme() const;
+    /// What changed before the device could tell of it.
+    void catchUp();
+    void useLanguage();
+    void useTheme();
 
     WApp& app_;
     Toolkit::Messages messages_;
@@ -51,6 +53,9 @@ private:
     std::optional<BusPresence> presence_;
     std::optional<device::ApplicationLock> instance_;
     device::Events::Subscription settings_;
+    /// The language and the theme that are in use.
+    std::string language_;
+    bool isDark_ = false;
     LaunchRequest::Extras extras_;
     Ecore_Idle_Enterer* firstRequest_ = nullptr;
     bool created_ = false;

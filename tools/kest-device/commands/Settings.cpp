@@ -26,12 +26,13 @@ Examples:
   kest-device get db/menu_widget/language --json)";
 
 constexpr char setExamples[] =
-    R"(KEY is language, country, theme or screen, or a vconf key, which holds a '/' and takes any value.
+    R"(KEY is language, country, theme or screen, or a vconf key, which holds a '/'; other keys than theirs take any value.
 Running applications hear of the change; the command returns when their screens have settled.
 
 language  one that the device's own texts exist in, such as ko_KR
 country   two capital letters such as IN, or none. As a customisation reset does, it also clears the
-          preferences of every application; an application follows at its next start.
+          preferences of every application; an application follows when it loads anew, at the latest at
+          its next start.
 theme     light or dark
 screen    720x1280 or 480x800; an application follows at its next start
 
@@ -41,7 +42,7 @@ Examples:
   kest-device set db/setting/theme dark)";
 
 constexpr char unsetExamples[] = R"(KEY is language, country, theme or screen, or a vconf key, which holds a '/'.
-The device goes on with what a fresh one has, which 'kest-device status' tells.
+A key that a fresh device has not got is removed.
 Without a country, preferences are cleared as by 'kest-device set country'.
 
 Example:
@@ -97,7 +98,7 @@ void addSet(CLI::App& app, Session& session) {
 }
 
 void addUnset(CLI::App& app, Session& session) {
-    CLI::App* command = app.add_subcommand("unset", "Remove a setting, as if it had never been set");
+    CLI::App* command = app.add_subcommand("unset", "Give a setting what it has on a fresh device");
     const auto options = std::make_shared<Options>();
     command->add_option("key", options->key, "The setting")->type_name("KEY")->required();
     command->footer(unsetExamples);
