@@ -1,5 +1,7 @@
 #pragma once
 
+#include "KestProcessorTime.h"
+
 #include <cstddef>
 #include <cstdint>
 
@@ -31,7 +33,7 @@ public:
 private:
     bool __take(std::uint64_t& left, std::uint64_t amount) const;
 
-    std::int64_t begin;
+    KestProcessorTime time;
     // More than a 32-bit device can count in a size_t.
     std::uint64_t textBytes;
     std::uint64_t detailTextBytes;

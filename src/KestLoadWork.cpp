@@ -1,7 +1,5 @@
 #include "KestLoadWork.h"
 
-#include <ctime>
-
 namespace {
 
 const std::uint64_t mebibyte = 1024 * 1024;
@@ -14,23 +12,16 @@ const std::uint64_t mostKept = 64 * mebibyte;
 /// Looking up a short text costs as much as copying one of this length.
 const std::uint64_t leastText = 4096;
 
-const std::int64_t nanosecondsOfSecond = 1000000000;
-const std::int64_t longest = 10 * nanosecondsOfSecond;
-
-/// Of the processor, for this thread: what else the device does is not the load's.
-std::int64_t now() {
-    timespec time{};
-    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &time);
-    return time.tv_sec * nanosecondsOfSecond + time.tv_nsec;
-}
+const std::int64_t longestSeconds = 10;
 
 }  // namespace
 
 KestLoadWork::KestLoadWork()
-    : begin(now()), textBytes(mostText), detailTextBytes(mostTextOfDetail), fileBytes(mostFiles), keptBytes(mostKept) {}
+    : time(longestSeconds), textBytes(mostText), detailTextBytes(mostTextOfDetail), fileBytes(mostFiles),
+      keptBytes(mostKept) {}
 
 bool KestLoadWork::__take(std::uint64_t& left, std::uint64_t amount) const {
-    const bool enough = amount <= left && now() - begin < longest;
+    const bool enough = amount <= left && !time.isOver();
     left = enough ? left - amount : 0;
     return enough;
 }

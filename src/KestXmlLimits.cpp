@@ -10,8 +10,9 @@ namespace {
 /// A tag of four bytes becomes an element of more than a hundred.
 const size_t mostTags = 3000000;
 
-/// What entities stand for may hold tags that nobody can count without expanding them.
-const size_t longestWithDocumentType = 64 * 1024;
+/// What entities stand for may hold tags that nobody can count without expanding them. Names are looked up in all
+/// namespaces, letter by letter, and messages about them quote all of a namespace. No catalogue has a use for either.
+const size_t longestWithDeclarations = 64 * 1024;
 
 const std::uint64_t heaviest = 64 * 1024 * 1024;
 
@@ -29,12 +30,7 @@ std::uint64_t comparisonsOf(std::uint64_t attributes) {
     return attributes * attributes / 2;
 }
 
-/// The parser takes no deeper nesting. Where there are namespaces it looks for that of a name in each element around
-/// it.
-const std::uint64_t deepest = 256;
-
-/// Counts what the parser compares: the attributes of each tag with each other, and the names of tags and attributes
-/// with the namespaces in force.
+/// Counts what the parser compares: the attributes of each tag with each other.
 /// Nothing is taken for a comment or a section: where one ends the parser, which goes on after errors, may see it
 /// otherwise. A tag ends at its ">" or at the next "<", since no attribute's value can hold that, and every attribute
 /// has a value in quotes after a "=". So the parser never finds more than is counted here, wherever it finds tags.
@@ -51,10 +47,7 @@ public:
         return tags <= mostTags;
     }
 
-    std::uint64_t inAll() const {
-        const std::uint64_t ofName = namespaces > 0 ? namespaces + deepest : 0;
-        return ofAttributes + ofName * (tags + attributesInAll);
-    }
+    std::uint64_t inAll() const { return ofAttributes; }
 
 private:
     /// From behind its "<"; where it ends.
@@ -66,12 +59,9 @@ private:
             if (beforeValue && (character == '"' || character == '\'')) {
                 ++attributes;
                 at = __endOfValue(at);
-            } else if (character == 'x' && text.compare(at, 5, "xmlns") == 0) {
-                ++namespaces;
             }
             beforeValue = character == '=' || (beforeValue && std::isspace(static_cast<unsigned char>(character)));
         }
-        attributesInAll += attributes;
         ofAttributes += comparisonsOf(attributes);
         return at;
     }
@@ -85,8 +75,6 @@ private:
 
     const std::string& text;
     std::uint64_t tags = 0;
-    std::uint64_t namespaces = 0;
-    std::uint64_t attributesInAll = 0;
     std::uint64_t ofAttributes = 0;
 };
 
@@ -103,6 +91,7 @@ std::uint64_t bytesQuotedFromComments(const std::string& text) {
         const bool closes = dashes == 2 && end < text.size() && text[end] == '>';
         if (begin == std::string::npos) {
             begin = opens && !closes ? at : begin;
+            bytes += std::uint64_t{dashes} * dashes;
         } else if (closes && !opens) {
             begin = std::string::npos;
         } else {
@@ -112,8 +101,8 @@ std::uint64_t bytesQuotedFromComments(const std::string& text) {
     return bytes;
 }
 
-bool hasDocumentType(const std::string& text) {
-    return KestMarkup::find(text, "<!DOCTYPE", 0) != std::string::npos;
+bool contains(const std::string& text, const char* what) {
+    return KestMarkup::find(text, what, 0) != std::string::npos;
 }
 
 bool declaresParameterEntity(const std::string& text) {
@@ -128,10 +117,10 @@ bool declaresParameterEntity(const std::string& text) {
     return false;
 }
 
-/// Attributes that are declared come with every element, and parameter entities hide what is declared.
+/// Attributes that are declared come with every element, and parameter entities hide what is declared. An entity in a
+/// namespace is parsed anew each time that it is referred to, with all that is nested in it.
 bool isBadDocumentType(const std::string& text) {
-    return text.size() > longestWithDocumentType || KestMarkup::find(text, "<!ATTLIST", 0) != std::string::npos ||
-           declaresParameterEntity(text);
+    return contains(text, "<!ATTLIST") || declaresParameterEntity(text) || contains(text, "xmlns");
 }
 
 }  // namespace
@@ -139,10 +128,11 @@ bool isBadDocumentType(const std::string& text) {
 const size_t KestXmlLimits::longestFile;
 
 bool KestXmlLimits::accept(const std::string& text, std::uint64_t& weight) {
-    if (hasDocumentType(text)) {
+    const bool hasDocumentType = contains(text, "<!DOCTYPE");
+    if (hasDocumentType || contains(text, "xmlns")) {
         // Entities can stand for attributes, one after the other, that are in none of its tags.
         weight = comparisonsOf(text.size() / shortestAttribute) / comparisonsOfByte;
-        return !isBadDocumentType(text);
+        return text.size() <= longestWithDeclarations && !(hasDocumentType && isBadDocumentType(text));
     }
     Comparisons comparisons(text);
     const bool readable = comparisons.count();

@@ -58,11 +58,31 @@ TEST_F(HostileXml, MayHaveManyAttributesInEveryTag) {
 }
 
 TEST_F(HostileXml, MayHaveHundredsOfNamespaces) {
-    EXPECT_EQ(loadDetail(withNamespaces(500, repeated("<z:a/>", 10000))).menuTitle, "Title");
+    EXPECT_EQ(loadDetail(withNamespaces(500, repeated("<z:a/>", 8000))).menuTitle, "Title");
 }
 
-TEST_F(HostileXml, IsNotParsedWithThousandsOfNamespacesThatEveryElementAsksFor) {
-    expectNotParsed(withNamespaces(8000, repeated("<z:a/>", 1500000)));
+TEST_F(HostileXml, IsNotParsedWithNamespacesInALongFile) {
+    const std::string begin = "<tip xmlns:b='u'><items><item><title>Title</title></item></items>";
+    const std::string end = "</tip>";
+    const std::string rest(64 * 1024 - begin.size() - end.size(), ' ');
+    EXPECT_EQ(loadDetail(begin + rest + end).menuTitle, "Title");
+    expectNotParsed(begin + rest + " " + end);
+}
+
+TEST_F(HostileXml, MayRepeatAttributesOfLongNamespaces) {
+    // Each message about one quotes the namespace.
+    const std::string name = "'urn:" + std::string(20000, 'u') + "'";
+    loadDetail("<tip xmlns:b=" + name + " xmlns:c=" + name + " b:x=''" + repeated(" c:x=''", 3000) + "><items/></tip>");
+}
+
+TEST_F(HostileXml, IsReadForAFewSecondsWhenItHasMillionsOfNames) {
+    std::string names;
+    for (int i = 0; names.size() < (15 << 20); ++i)
+        names += "<n" + std::to_string(i) + "/>";
+    EXPECT_EQ(
+        loadDetail("<tip><items><item><title>Title</title>" + names + "<title>Behind</title></item></items></tip>")
+            .menuTitle,
+        "Title");
 }
 
 TEST_F(HostileXml, IsNotParsedWithMillionsOfElements) {
@@ -74,17 +94,6 @@ TEST_F(HostileXml, MayHaveAMillionElements) {
                          repeated("<x/>", 500000) + "<title>Title</title></item></items></tip>")
                   .menuTitle,
               "Title");
-}
-
-TEST_F(HostileXml, IsNotParsedWithThousandsOfNamespacesThatEveryAttributeAsksFor) {
-    std::string attributes;
-    for (int i = 0; i < 100; ++i)
-        attributes += " z:a" + std::to_string(i) + "=''";
-    expectNotParsed(withNamespaces(3000, repeated("<x" + attributes + "/>", 3000)));
-}
-
-TEST_F(HostileXml, IsNotParsedWithMillionsOfElementsWhoseNamespaceIsFarAway) {
-    expectNotParsed("<tip xmlns='u' xmlns:p='v'>" + repeated("<p:a>", 253) + repeated("<a/>", 2900000));
 }
 
 TEST_F(HostileXml, MayHaveErrorsThatQuoteItAllEachTime) {
@@ -111,6 +120,7 @@ TEST_F(HostileXml, IsNotParsedWithManyDashesBehindALongComment) {
     EXPECT_EQ(
         loadDetail("<tip><!--" + std::string(9000000, 'x') + " -- " + std::string(20, '-') + "-->" + title).menuTitle,
         "Title");
+    expectNotParsed("<tip><!" + std::string(1000000, '-') + ">" + title);
     expectNotParsed("<tip><!--" + std::string(9000000, 'x') + repeated("x--->", 20000) + "-->" + title);
     EXPECT_EQ(loadDetail("<tip>" + repeated("<!-- a - b -->", 500000) + title).menuTitle, "Title");
     EXPECT_EQ(loadDetail("<tip>" + repeated("a text -- with dashes ", 400000) + title).menuTitle, "Title");

@@ -98,6 +98,12 @@ TEST_F(HostileXml, IsNotParsedWithParameterEntities) {
     expectNotParsed(file("<!ENTITY\n% p \"<!&#65;TTLIST x a CDATA ''>\">%p;", "<title>Title</title>"));
 }
 
+TEST_F(HostileXml, IsNotParsedWithEntitiesInNamespaces) {
+    const std::string declarations = entity("e0", "x") + entity("e1", repeated("&e0;", 100)) +
+                                     entity("e2", repeated("&e1;", 100)) + "<!--" + std::string(40000, 'x') + "-->";
+    expectNotParsed("<!DOCTYPE tip [" + declarations + "]><tip xmlns='&e2;'>" + repeated("&e2;", 1000) + "</tip>");
+}
+
 TEST_F(HostileXml, EntityThatHoldsItselfEnds) {
     EXPECT_EQ(loadDetail(file(entity("a", "&a;"), "<title>x&a;y</title>")).appName, "");
     EXPECT_EQ(loadDetail(file(entity("a", "&b;") + entity("b", "&a;"), "<title>x&a;y</title>")).appName, "");
