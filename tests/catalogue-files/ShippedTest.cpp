@@ -1,4 +1,5 @@
 #include "Catalogue.h"
+#include "Pictures.h"
 #include "Rules.h"
 #include "Schema.h"
 #include "Texts.h"
@@ -164,6 +165,35 @@ TEST(ShippedPackages, HaveAManifestAndAnIcon) {
         EXPECT_NE("", textOf(childNamed(application, "label"))) << id;
         EXPECT_EQ((Size{196, 196}), sizeOf(root / "shared/res" / textOf(childNamed(application, "icon")))) << id;
     }
+}
+
+TEST(ShippedPictures, FitThePage) {
+    EXPECT_THAT(everyTip(picturesFitThePage), IsEmpty());
+}
+
+TEST(ShippedPictures, BelongToTips) {
+    EXPECT_THAT(picturesBelongToTips(readCatalogue(project)), IsEmpty());
+}
+
+TEST(ShippedPictures, AreOfEveryKindThatAPageShows) {
+    std::set<std::string> kinds;
+    for (const Tip& tip : readCatalogue(project)) {
+        const Pictures pictures = picturesOf(tip);
+        const std::size_t count = pictures.shown.size();
+        const bool isTall = count == 1 && sizeOf(pictures.shown.begin()->second).height > 655;
+        kinds.insert(isTall       ? "tall"
+                     : count == 0 ? "placeholder"
+                     : count == 1 ? "plain"
+                     : count == 2 ? "two"
+                     : count >= 5 ? "five or more"
+                                  : "three or four");
+        if (count > 1)
+            kinds.insert(pictures.markers.empty() ? "without markers" : "with markers");
+        if (!pictures.russian.empty() && pictures.russian.size() == count)
+            kinds.insert("Russian");
+    }
+    EXPECT_THAT(kinds, ElementsAre("Russian", "five or more", "placeholder", "plain", "tall", "three or four", "two",
+                                   "with markers", "without markers"));
 }
 
 TEST(ShippedPictures, HaveTheSizesOfTheirPlaces) {
