@@ -8,8 +8,8 @@
 
 namespace bench {
 
-/// A device of its own with a catalogue of `menus` menus about ten applications, every file of the size and the
-/// make of those that ship: a page of five texts, translated by a string file with three languages.
+/// A device of its own with a catalogue of `menus` menus about ten applications, every file of the make of
+/// those that ship: a page of five texts as long as theirs, translated by a string file with three languages.
 /// Its device is the process's from the start, until another one is; its files go with it.
 class Catalogue {
 public:

@@ -3,6 +3,7 @@
 #include "Markup.h"
 
 #include <algorithm>
+#include <libxml/xmlstring.h>
 #include <map>
 #include <set>
 
@@ -15,21 +16,6 @@ const std::vector<std::string> regions = {"Global", "India", "Russia", "Indonesi
 
 std::string at(const std::string& file, long line, const std::string& problem) {
     return file + ":" + std::to_string(line) + ": " + problem;
-}
-
-/// As the application looks a text up: shared texts first, then the tip's own by "ko_KR", then by "ko".
-std::optional<std::string> textFor(const Tip& tip, const std::string& language, const std::string& id,
-                                   const SharedTexts& shared) {
-    if (std::optional<std::string> text = shared(language, id))
-        return text;
-    const std::vector<String>& own = tip.strings.strings;
-    for (const std::string& region : {language.substr(0, 5), language.substr(0, 2)}) {
-        const auto last = std::find_if(
-            own.rbegin(), own.rend(), [&](const String& string) { return string.region == region && string.id == id; });
-        if (last != own.rend())
-            return last->value;
-    }
-    return std::nullopt;
 }
 
 /// One problem in one of the languages.
@@ -56,7 +42,38 @@ bool hasCountry(const std::string& language, const std::string& region) {
     return region == language || region == language.substr(0, 2);
 }
 
+/// The letters of the languages that have letters of their own, first and last.
+const std::map<std::string, std::pair<int, int>> letters = {
+    {"ar", {0x0620, 0x06FF}}, {"hi", {0x0900, 0x097F}}, {"ko", {0xAC00, 0xD7A3}},
+    {"ru", {0x0400, 0x04FF}}, {"zh", {0x4E00, 0x9FFF}},
+};
+
+bool hasLetterBetween(int first, int last, const std::string& text) {
+    for (std::size_t at = 0; at < text.size();) {
+        int length = static_cast<int>(text.size() - at);
+        const int letter = xmlGetUTF8Char(reinterpret_cast<const unsigned char*>(text.data()) + at, &length);
+        if (letter >= first && letter <= last)
+            return true;
+        at += static_cast<std::size_t>(std::max(1, length));
+    }
+    return false;
+}
+
 }  // namespace
+
+std::optional<std::string> textIn(const std::string& language, const Tip& tip, const std::string& id,
+                                  const SharedTexts& shared) {
+    if (std::optional<std::string> text = shared(language, id))
+        return text;
+    const std::vector<String>& own = tip.strings.strings;
+    for (const std::string& region : {language.substr(0, 5), language.substr(0, 2)}) {
+        const auto last = std::find_if(
+            own.rbegin(), own.rend(), [&](const String& string) { return string.region == region && string.id == id; });
+        if (last != own.rend())
+            return last->value;
+    }
+    return std::nullopt;
+}
 
 Problems contentsAreWellWritten(const Tip& tip) {
     Problems problems;
@@ -75,7 +92,7 @@ Problems idsAreTranslated(const Tip& tip, const std::vector<std::string>& langua
     const std::map<std::string, long> ids = idsOf(tip);
     for (const auto& [id, line] : ids) {
         for (const std::string& language : languages) {
-            if (!textFor(tip, language, id, shared))
+            if (!textIn(language, tip, id, shared))
                 problems.push_back(inLanguage(tip.detail.file, line, id + " has no text", language));
         }
     }
@@ -89,12 +106,22 @@ Problems idsAreTranslated(const Tip& tip, const std::vector<std::string>& langua
     return problems;
 }
 
+Problems translationsHaveLettersOfTheirLanguage(const Tip& tip) {
+    Problems problems;
+    for (const String& string : tip.strings.strings) {
+        const auto own = letters.find(string.region.substr(0, 2));
+        if (own != letters.end() && !hasLetterBetween(own->second.first, own->second.second, string.value))
+            problems.push_back(at(tip.strings.file, string.line, string.id + " is not written in " + string.region));
+    }
+    return problems;
+}
+
 Problems translationsFitTheirPlace(const Tip& tip, const std::vector<std::string>& languages,
                                    const SharedTexts& shared) {
     Problems problems;
     const Detail& detail = tip.detail;
     for (const std::string& language : languages) {
-        const auto translate = [&](const std::string& id) { return textFor(tip, language, id, shared).value_or(id); };
+        const auto translate = [&](const std::string& id) { return textIn(language, tip, id, shared).value_or(id); };
         for (const Line& id : {detail.titleId, detail.appNameId}) {
             if (translate(id.text).find_first_of("<&\n") != std::string::npos)
                 problems.push_back(inLanguage(detail.file, id.number, id.text + " is no plain line", language));

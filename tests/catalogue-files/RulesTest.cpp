@@ -41,6 +41,7 @@ TEST(Rules, FindNothingWrongWithAGoodTip) {
     const Tip tip = goodTip();
     EXPECT_THAT(contentsAreWellWritten(tip), IsEmpty());
     EXPECT_THAT(idsAreTranslated(tip, languages, clockOnly), IsEmpty());
+    EXPECT_THAT(translationsHaveLettersOfTheirLanguage(tip), IsEmpty());
     EXPECT_THAT(translationsFitTheirPlace(tip, languages, clockOnly), IsEmpty());
     EXPECT_THAT(filesExist(tip), IsEmpty());
     EXPECT_THAT(pathsAreUnique({tip}), IsEmpty());
@@ -85,6 +86,21 @@ TEST(Rules, RefuseATextInALanguageThatTheDeviceDoesNotHave) {
     tip.strings.strings.push_back({"en_GB", "IDS_OPEN", "Open", 34});
     EXPECT_THAT(idsAreTranslated(tip, languages, clockOnly),
                 ElementsAre("faces-string.xml:34: the device has no language en_GB"));
+}
+
+TEST(Rules, RefuseATranslationWithoutALetterOfItsLanguage) {
+    Tip tip = goodTip();
+    tip.strings.strings = {
+        {"ar", "IDS_A", "Open", 4},      {"hi", "IDS_A", "Open", 9},        {"ko", "IDS_A", "Open", 14},
+        {"ru", "IDS_A", "Open", 19},     {"zh_CN", "IDS_A", "Open", 24},    {"de", "IDS_A", "Open", 29},
+        {"ar", "IDS_B", "Wi-Fi و", 34},  {"hi", "IDS_B", "Wi-Fi का", 39},   {"ko", "IDS_B", "Wi-Fi로", 44},
+        {"ru", "IDS_B", "по Wi-Fi", 49}, {"zh_CN", "IDS_B", "Wi-Fi 上", 54}};
+    EXPECT_THAT(translationsHaveLettersOfTheirLanguage(tip),
+                ElementsAre("faces-string.xml:4: IDS_A is not written in ar",
+                            "faces-string.xml:9: IDS_A is not written in hi",
+                            "faces-string.xml:14: IDS_A is not written in ko",
+                            "faces-string.xml:19: IDS_A is not written in ru",
+                            "faces-string.xml:24: IDS_A is not written in zh_CN"));
 }
 
 TEST(Rules, RefuseATitleThatIsMarkup) {

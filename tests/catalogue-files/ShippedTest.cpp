@@ -101,6 +101,10 @@ TEST(ShippedCatalogue, IsTranslated) {
                 IsEmpty());
 }
 
+TEST(ShippedCatalogue, HasTranslationsInTheirLanguage) {
+    EXPECT_THAT(everyTip(translationsHaveLettersOfTheirLanguage), IsEmpty());
+}
+
 TEST(ShippedCatalogue, HasTranslationsThatFitTheirPlace) {
     EXPECT_THAT(
         everyTip([](const Tip& tip) { return translationsFitTheirPlace(tip, languagesIn(DEVICE_TEXTS), sharedText); }),

@@ -87,7 +87,8 @@ INSTANTIATE_TEST_SUITE_P(Texts, Domain,
                          [](const auto& instance) { return instance.param.domain; });
 
 TEST(Texts, OfTheApplicationAndTheDeviceHaveTheSameLanguages) {
-    EXPECT_THAT(languagesIn(DEVICE_TEXTS), ElementsAre("en_US", "ko_KR", "ru_RU"));
+    EXPECT_THAT(languagesIn(DEVICE_TEXTS),
+                ElementsAre("ar_AE", "de_DE", "en_US", "hi_IN", "id_ID", "ko_KR", "ru_RU", "zh_CN"));
     EXPECT_EQ(languagesIn(DEVICE_TEXTS), languagesIn(APPLICATION_TEXTS));
 }
 
@@ -99,6 +100,10 @@ TEST(Texts, OfTheApplicationAreWhatItShows) {
               sharedText("en_US", "IDS_KESTS_SBODY_DISCOVER_USEFUL_FEATURES_HERE_ABB"));
     EXPECT_EQ("팁", sharedText("ko_KR", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
     EXPECT_EQ("Советы", sharedText("ru_RU", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
+    EXPECT_EQ("Tipps", sharedText("de_DE", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
+    EXPECT_EQ("टिप्स", sharedText("hi_IN", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
+    EXPECT_EQ("نصائح", sharedText("ar_AE", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
+    EXPECT_EQ("使用技巧", sharedText("zh_CN", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME"));
     EXPECT_EQ(std::nullopt, sharedText("en_US", "IDS_UNKNOWN"));
 }
 
