@@ -17,7 +17,7 @@ std::vector<std::string> documentLines() {
 }
 
 const std::regex heading(R"(### `([^`]+)`)");
-const std::regex row(R"(\| (part|in|out|data) \| `([^`]+)` \| (.*) \|)");
+const std::regex row(R"re(\| (part|in|in ""|out|data) \| `([^`]+)` \| (.*) \|)re");
 const std::regex quotedName(R"(\| `([^`]+)` \|.*)");
 
 std::string withoutQuotes(const std::string& text) {

@@ -8,7 +8,7 @@ namespace theme_test {
 /// One line of a group's table in docs/theme.md.
 struct Promise {
     std::string group;
-    std::string kind;  ///< "part", "in", "out" or "data"
+    std::string kind;  ///< "part", "in", "in \"\"", "out" or "data"
     std::string name;
     std::string value;  ///< of a data item
 };

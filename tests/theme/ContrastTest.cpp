@@ -1,3 +1,4 @@
+#include "support/TemporaryFolder.h"
 #include "ui/UiTest.h"
 
 #include <Edje.h>
@@ -7,6 +8,7 @@
 #include <cstdio>
 #include <map>
 #include <memory>
+#include <regex>
 
 namespace {
 
@@ -68,12 +70,65 @@ TEST_P(Contrast, OfTextIsAtLeastFourAndAHalf) {
         for (const char* ground : {"device/page", "device/pressed"})
             EXPECT_GE(contrast(colours_.at(text), colours_.at(ground)), 4.5) << text << " on " << ground;
     }
+    for (const char* text : {"device/reading", "device/link"})
+        EXPECT_GE(contrast(colours_.at(text), colours_.at("device/page")), 4.5) << text;
+    EXPECT_GE(contrast(colours_.at("device/link"), colours_.at("device/link/pressed")), 4.5);
 }
 
 TEST_P(Contrast, OfMarksIsAtLeastThree) {
     for (const char* mark : {"device/focus", "device/scrollbar"})
         EXPECT_GE(contrast(colours_.at(mark), colours_.at("device/page")), 3.0) << mark;
 }
+
+/// The colours of the application's table, those of the device that it sets among them.
+Colours applicationColours(const std::string& theme) {
+    const std::string text = support::readFile(PROJECT "/res/table/com.ravella.kest_ChangeableColorInfo.xml");
+    const std::regex row("class=\"([^\"]+)\" light=\"#([0-9A-F]{6})\" dark=\"#([0-9A-F]{6})\"");
+    Colours colours;
+    for (std::sregex_iterator match(text.begin(), text.end(), row), end; match != end; ++match) {
+        const int value = std::stoi((*match)[theme == "dark" ? 3 : 2], nullptr, 16);
+        colours[(*match)[1]] = {value >> 16, value >> 8 & 255, value & 255};
+    }
+    return colours;
+}
+
+class ContrastOnAPage : public test_ui::UiTest, public testing::WithParamInterface<const char*> {
+protected:
+    const Colours colours_ = applicationColours(GetParam());
+};
+
+TEST_P(ContrastOnAPage, OfTheTitleTheTextAndItsLinksIsAtLeastFourAndAHalf) {
+    constexpr Colour black;
+    const Colour paper = colours_.at("kest/content/info");
+    EXPECT_GE(contrast(black, paper), 4.5);
+    EXPECT_GE(contrast(colours_.at("device/reading"), paper), 4.5);
+    EXPECT_GE(contrast(colours_.at("device/link"), paper), 4.5);
+    EXPECT_GE(contrast(colours_.at("device/link"), colours_.at("device/link/pressed")), 4.5);
+}
+
+TEST_P(ContrastOnAPage, OfTheReplyArrowIsAtLeastFourAndAHalf) {
+    for (const char* ground : {"kest/reply/ground", "kest/reply/pressed"})
+        EXPECT_GE(contrast(colours_.at("kest/reply/arrow"), colours_.at(ground)), 4.5) << ground;
+}
+
+TEST_P(ContrastOnAPage, OfTheReplyButtonOrTheLineAroundItIsAtLeastThreeOnAnyPicture) {
+    for (const char* ground : {"kest/reply/ground", "kest/reply/pressed"}) {
+        for (int grey = 0; grey < 256; ++grey) {
+            const Colour picture{grey, grey, grey};
+            const double disc = contrast(colours_.at(ground), picture);
+            const double line = contrast(colours_.at("kest/reply/arrow"), picture);
+            EXPECT_GE(std::max(disc, line), 3.0) << ground << " on " << grey;
+        }
+    }
+}
+
+TEST_P(ContrastOnAPage, OfThePicturesFrameIsAtLeastOneAndAHalf) {
+    EXPECT_GE(contrast(colours_.at("kest/picture/frame"), colours_.at("kest/content/background")), 1.5);
+    EXPECT_GE(contrast(colours_.at("kest/picture/frame"), colours_.at("kest/picture/ground")), 3.0);
+}
+
+INSTANTIATE_TEST_SUITE_P(Theme, ContrastOnAPage, testing::Values("light", "dark"),
+                         [](const auto& theme) { return std::string(theme.param); });
 
 INSTANTIATE_TEST_SUITE_P(Theme, Contrast, testing::Values("light", "dark"),
                          [](const auto& theme) { return std::string(theme.param); });

@@ -7,6 +7,7 @@
 #include <Edje_Edit.h>
 
 #include <memory>
+#include <regex>
 #include <stdexcept>
 #include <vector>
 
@@ -37,8 +38,22 @@ void insertName(std::set<std::string>& names, const std::string& name) {
         names.insert(name);
 }
 
+/// Text blocks are coloured by their styles, which belong to the file: "color=cc:<class>".
+void readStyles(Evas_Object* edit, Group& group) {
+    const std::regex colour("color=cc:([^ ']+)");
+    for (const std::string& style : strings(edje_edit_styles_list_get(edit))) {
+        for (const std::string& tag : strings(edje_edit_style_tags_list_get(edit, style.c_str()))) {
+            const std::string value = string(edje_edit_style_tag_value_get(edit, style.c_str(), tag.c_str()));
+            for (std::sregex_iterator match(value.begin(), value.end(), colour), end; match != end; ++match)
+                group.colourClasses.insert((*match)[1]);
+        }
+    }
+}
+
 void readPart(Evas_Object* edit, const std::string& part, Group& group) {
     group.parts.insert(part);
+    if (edje_edit_part_type_get(edit, part.c_str()) == EDJE_PART_TYPE_TEXTBLOCK)
+        readStyles(edit, group);
     const bool isText = edje_edit_part_type_get(edit, part.c_str()) == EDJE_PART_TYPE_TEXT;
     for (const std::string& state : strings(edje_edit_part_states_list_get(edit, part.c_str()))) {
         const std::string name = state.substr(0, state.find(' '));
