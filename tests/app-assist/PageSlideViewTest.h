@@ -69,6 +69,10 @@ protected:
         evas_object_show(scroller);
         return layout;
     }
+    Elm_Object_Item* onPushToNaviframe(Evas_Object* naviframe) override {
+        Evas_Object* back = elm_button_add(naviframe);
+        return elm_naviframe_item_push(naviframe, nullptr, back, nullptr, getEvasObj(), nullptr);
+    }
     void onPushed(Elm_Object_Item*) override {
         for (app_assist::WView* page : pages_)
             appendPage(page);
@@ -105,12 +109,6 @@ protected:
     }
     void swipeLeft() { screen().swipe({600, 700}, {150, 700}); }
     void swipeRight() { screen().swipe({150, 700}, {600, 700}); }
-
-    /// Counts an event of the pager's scroller from now on.
-    void count(Pager& pager, const char* event, int& counter) {
-        evas_object_smart_callback_add(
-            pager.getScroller(), event, [](void* data, Evas_Object*, void*) { ++*static_cast<int*>(data); }, &counter);
-    }
 
     Story told() { return std::exchange(story_, {}); }
 

@@ -15,6 +15,8 @@ WPageSlideView::WPageSlideView() = default;
 WPageSlideView::~WPageSlideView() {
     for (WView* page : pages_)
         page->book_ = nullptr;
+    if (focusJob_)
+        ecore_job_del(focusJob_);
 }
 
 Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
@@ -26,6 +28,9 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
     BounceGuard::attach(scroller_);
     DragGuard::attach(scroller_);
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
+    evas_object_smart_callback_add(
+        scroller_, "scroll,page,changed",
+        [](void* self, Evas_Object*, void*) { static_cast<WPageSlideView*>(self)->turnFocus(); }, this);
     onInitScroller(scroller_);
     row_ = onCreateLayout(scroller_);
     elm_object_content_set(scroller_, row_);
@@ -86,6 +91,8 @@ bool WPageSlideView::putInRow(WView& page) {
     page.giveAway();
     elm_box_pack_end(row_, page.getEvasObj());
     evas_object_show(page.getEvasObj());
+    elm_object_tree_focus_allow_set(page.getEvasObj(), EINA_FALSE);
+    turnFocus();
     page.onSetAsPageContent();
     if (!life.expired())
         page.onPushed(page.getNaviItem());
@@ -112,6 +119,28 @@ void WPageSlideView::show(int index) {
     waitingPage_ = width > 0 ? -1 : index;
     if (width > 0)
         elm_scroller_page_show(scroller_, index, 0);
+    turnFocus();
+}
+
+int WPageSlideView::pageInView() const {
+    int index = 0;
+    elm_scroller_current_page_get(scroller_, &index, nullptr);
+    return waitingPage_ < 0 ? index : waitingPage_;
+}
+
+// EFL brings into view what gets the focus, and gives it to the first page when any of them is touched. Not at once:
+// it takes the place that a page had before the pages moved.
+void WPageSlideView::turnFocus() {
+    if (!focusJob_)
+        focusJob_ = ecore_job_add([](void* self) { static_cast<WPageSlideView*>(self)->focusPageInView(); }, this);
+}
+
+void WPageSlideView::focusPageInView() {
+    focusJob_ = nullptr;
+    evas_smart_objects_calculate(evas_object_evas_get(scroller_));
+    const int inView = pageInView();
+    for (int i = 0; i < getPageCount(); ++i)
+        elm_object_tree_focus_allow_set(pages_[static_cast<size_t>(i)]->getEvasObj(), i == inView);
 }
 
 void WPageSlideView::scrollerResized(void* data, Evas*, Evas_Object*, void*) {
