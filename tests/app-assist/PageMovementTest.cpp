@@ -196,4 +196,16 @@ TEST_F(PageMovement, APagerOfNoPageTakesASwipe) {
     EXPECT_EQ(0, framesInASecond());
 }
 
+TEST_F(PageMovement, APageTurnedToStaysInViewWhenTheScreenTurnsSmaller) {
+    listenTo(3);
+    swipeLeft();
+    test_ui::runFor(1.0);
+    heard();
+    evas_object_resize(naviframe_.getEvasObj(), 480, 800);
+    test_ui::runFor(0.5);
+    EXPECT_EQ(4, pager_->inView());
+    EXPECT_EQ(0, test_ui::geometry(pages_[4]->getEvasObj()).x);
+    EXPECT_THAT(heard(), ElementsAre());
+}
+
 }  // namespace

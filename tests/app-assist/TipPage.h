@@ -166,6 +166,9 @@ private:
 /// What an application hears of its pager's movements: "start", and "stop <page in view>".
 class Movements {
 public:
+    /// What the application does then, the next time.
+    std::function<void()> atStart, atStop;
+
     void listenTo(Pager& pager) {
         pager_ = &pager;
         evas_object_smart_callback_add(
@@ -173,12 +176,21 @@ public:
             [](void* self, Evas_Object*, void*) { static_cast<Movements*>(self)->stopped(); }, this);
         evas_object_smart_callback_add(
             pager.getScroller(), "scroll,anim,start",
-            [](void* self, Evas_Object*, void*) { static_cast<Movements*>(self)->heard_.emplace_back("start"); }, this);
+            [](void* self, Evas_Object*, void*) { static_cast<Movements*>(self)->started(); }, this);
     }
     Story heard() { return std::exchange(heard_, {}); }
 
 private:
-    void stopped() { heard_.push_back("stop " + std::to_string(pager_->inView())); }
+    void started() {
+        heard_.emplace_back("start");
+        if (const auto act = std::exchange(atStart, nullptr))
+            act();
+    }
+    void stopped() {
+        heard_.push_back("stop " + std::to_string(pager_->inView()));
+        if (const auto act = std::exchange(atStop, nullptr))
+            act();
+    }
 
     Pager* pager_ = nullptr;
     Story heard_;

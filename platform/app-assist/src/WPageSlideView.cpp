@@ -30,7 +30,7 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
     evas_object_smart_callback_add(
         scroller_, "scroll,page,changed",
-        [](void* self, Evas_Object*, void*) { static_cast<WPageSlideView*>(self)->turnFocus(); }, this);
+        [](void* self, Evas_Object*, void*) { static_cast<WPageSlideView*>(self)->pageTurned(); }, this);
     onInitScroller(scroller_);
     row_ = onCreateLayout(scroller_);
     elm_object_content_set(scroller_, row_);
@@ -114,18 +114,16 @@ void WPageSlideView::showPage(int index, bool relayout) {
 void WPageSlideView::show(int index) {
     // Before its contents are laid out, a scroller shows another page than it was told.
     evas_smart_objects_calculate(evas_object_evas_get(scroller_));
-    int width = 0;
-    elm_scroller_region_get(scroller_, nullptr, nullptr, &width, nullptr);
-    waitingPage_ = width > 0 ? -1 : index;
-    if (width > 0)
+    elm_scroller_region_get(scroller_, nullptr, nullptr, &width_, nullptr);
+    pageInView_ = index;
+    if (width_ > 0)
         elm_scroller_page_show(scroller_, index, 0);
     turnFocus();
 }
 
-int WPageSlideView::pageInView() const {
-    int index = 0;
-    elm_scroller_current_page_get(scroller_, &index, nullptr);
-    return waitingPage_ < 0 ? index : waitingPage_;
+void WPageSlideView::pageTurned() {
+    elm_scroller_current_page_get(scroller_, &pageInView_, nullptr);
+    turnFocus();
 }
 
 // EFL brings into view what gets the focus, and gives it to the first page when any of them is touched. Not at once:
@@ -138,22 +136,23 @@ void WPageSlideView::turnFocus() {
 void WPageSlideView::focusPageInView() {
     focusJob_ = nullptr;
     evas_smart_objects_calculate(evas_object_evas_get(scroller_));
-    const int inView = pageInView();
     for (int i = 0; i < getPageCount(); ++i)
-        elm_object_tree_focus_allow_set(pages_[static_cast<size_t>(i)]->getEvasObj(), i == inView);
+        elm_object_tree_focus_allow_set(pages_[static_cast<size_t>(i)]->getEvasObj(), i == pageInView_);
 }
 
+// A scroller that gets another width stays where it was in pixels, which is another page.
 void WPageSlideView::scrollerResized(void* data, Evas*, Evas_Object*, void*) {
     auto* view = static_cast<WPageSlideView*>(data);
     elm_box_recalculate(view->row_);
-    if (view->waitingPage_ < 0)
+    int width = 0;
+    elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, nullptr);
+    if (width == view->width_)
         return;
-    const auto showWaiting = [view](WView*) {
-        if (view->waitingPage_ >= 0)
-            view->showPage(std::exchange(view->waitingPage_, -1), true);
+    const auto showAgain = [view](WView*) {
+        view->showPage(view->pageInView_, true);
         return false;
     };
-    WUiTimer::addJob(showWaiting, view, view->scroller_);
+    WUiTimer::addJob(showAgain, view, view->scroller_);
 }
 
 }  // namespace app_assist

@@ -38,7 +38,7 @@ private:
     bool putInRow(WView& page);
     void pageGone(const WView& page);
     void show(int index);
-    int pageInView() const;
+    void pageTurned();
     void turnFocus();
     void focusPageInView();
     static void layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* view);
@@ -47,8 +47,10 @@ private:
     bool showScroll_ = false;
     Evas_Object* scroller_ = nullptr;
     Evas_Object* row_ = nullptr;
-    /// The page to show when the scroller gets its size; -1 for none.
-    int waitingPage_ = -1;
+    /// The page that is shown, or will be when the scroller has a width.
+    int pageInView_ = 0;
+    /// The scroller's, when that page was last shown.
+    int width_ = 0;
     Ecore_Job* focusJob_ = nullptr;
     std::vector<WView*> pages_;
 };
