@@ -26,6 +26,14 @@ public:
         elm_box_pack_end(getEvasObj(), kind_ == Pictures::Sequence ? makeSequence() : makeTall());
         elm_box_pack_end(getEvasObj(), makeInfo());
     }
+    void addPicture() {
+        Evas_Object* row = elm_object_content_get(pictures);
+        Evas_Object* picture = evas_object_rectangle_add(evas_object_evas_get(row));
+        expand(picture);
+        pages.push_back(sized(row, picture, width, height));
+        expand(pages.back());
+        elm_box_pack_end(row, pages.back());
+    }
     void setText() {
         std::string text = "<font_size=36 align=left>" + text_;
         for (int i = 0; i < 40; ++i)
@@ -81,13 +89,8 @@ private:
         elm_box_horizontal_set(row, EINA_TRUE);
         elm_object_content_set(pictures, row);
         elm_scroller_page_relative_set(pictures, 1.0, 0.0);
-        for (int i = 0; i < 5; ++i) {
-            Evas_Object* picture = evas_object_rectangle_add(evas_object_evas_get(row));
-            expand(picture);
-            pages.push_back(sized(row, picture, width, height));
-            expand(pages.back());
-            elm_box_pack_end(row, pages.back());
-        }
+        for (int i = 0; i < 5; ++i)
+            addPicture();
         elm_scroller_page_bring_in(pictures, 0, 0);
         Evas_Object* area = sized(getEvasObj(), pictures, width, height);
         button = elm_button_add(area);

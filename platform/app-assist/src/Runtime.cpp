@@ -11,6 +11,8 @@
 #include <efl-answers/DisplayLanguage.h>
 #include <uxt/Theme.h>
 
+#include <Elementary.h>
+
 #include <cstdio>
 #include <cstdlib>
 #include <stdexcept>
@@ -172,7 +174,9 @@ void Runtime::settingChanged(const std::string& key) {
 }
 
 void Runtime::useLanguage() const {
-    DisplayLanguage(device_->language()).use();
+    const DisplayLanguage language(device_->language());
+    language.use();
+    elm_config_mirrored_set(language.isRightToLeft());
 }
 
 void Runtime::useTheme() const {

@@ -55,18 +55,22 @@ void WPageSlideView::onInitScroller(Evas_Object* scroller) {
 }
 
 // By hand: widgets overwrite a size that they were told to have at least, so no box would make them a page wide.
+// Where reading begins at the right the first page lies there, as the scroller counts its pages.
 void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* data) {
     const auto* view = static_cast<WPageSlideView*>(data);
     int x = 0, y = 0, width = 0, height = 0;
     evas_object_geometry_get(box, &x, &y, nullptr, nullptr);
     elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, &height);
-    int count = 0;
+    const int count = static_cast<int>(eina_list_count(children->children));
+    const bool mirrored = elm_object_mirrored_get(view->scroller_);
+    int index = 0;
     const Eina_List* node = nullptr;
     void* each = nullptr;
     EINA_LIST_FOREACH(children->children, node, each) {
         Evas_Object* page = static_cast<Evas_Object_Box_Option*>(each)->obj;
-        evas_object_move(page, x + width * count++, y);
+        evas_object_move(page, x + width * (mirrored ? count - 1 - index : index), y);
         evas_object_resize(page, width, height);
+        ++index;
     }
     evas_object_size_hint_min_set(box, width * count, height);
 }
