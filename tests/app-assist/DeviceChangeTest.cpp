@@ -100,6 +100,31 @@ TEST_F(DeviceChange, ThatWasNoneIsNotToldOf) {
     uxt_theme_delete_changed_callback(nullptr, never);
 }
 
+TEST_F(DeviceChange, MirrorsWidgetsFromTheStartWhereTheLanguageIsReadFromTheRight) {
+    set(device::keys::language, "ar_EG.UTF-8");
+    bool mirrored = false;
+    app_.inCreate = [&] { mirrored = elm_config_mirrored_get(); };
+    RunningApp running(app_);
+    EXPECT_TRUE(mirrored);
+}
+
+TEST_F(DeviceChange, MirrorsWidgetsBeforeTheHandlersOfALanguageChange) {
+    WAppEventHandler handler;
+    Story widgets;
+    RunningApp running(app_);
+    Evas_Object* label = elm_label_add(test_ui::UiTest::window());
+    handler.addEventHandler(
+        APP_EVENT_LANGUAGE_CHANGED,
+        [&](app_event_info_h, void*) {
+            widgets.emplace_back(elm_object_mirrored_get(label) ? "from the right" : "from the left");
+        },
+        nullptr);
+    set(device::keys::language, "ar_EG.UTF-8");
+    set(device::keys::language, "he_IL.UTF-8");
+    set(device::keys::language, "ko_KR.UTF-8");
+    EXPECT_THAT(widgets, ElementsAre("from the right", "from the right", "from the left"));
+}
+
 TEST_F(DeviceChange, AHandlerMayDestroyItselfAndOthersWhileItRuns) {
     auto first = std::make_unique<WAppEventHandler>();
     auto second = std::make_unique<WAppEventHandler>();

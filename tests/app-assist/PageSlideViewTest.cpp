@@ -27,17 +27,43 @@ TEST_F(PageSlideView, PagesAreAsLargeAsTheViewAndStandBesideEachOther) {
     }
 }
 
-class FirstPage : public PageSlideView, public testing::WithParamInterface<int> {};
+class FirstPage : public PageSlideView, public testing::WithParamInterface<std::tuple<int, bool>> {
+protected:
+    /// Opens a pager of fifteen pages above a list.
+    Pager* openAbove() {
+        naviframe_.push(new TellingView("list", story_), nullptr, nullptr);
+        test_ui::runFor(0.5);
+        return open(first(), 15, std::get<1>(GetParam()));
+    }
+    static int first() { return std::get<0>(GetParam()); }
+    void expectInView(const Pager& pager) const {
+        EXPECT_EQ(first(), pager.inView());
+        const Rect view = test_ui::geometry(pager.getScroller());
+        const Rect page = test_ui::geometry(pages_[static_cast<size_t>(first())]->getEvasObj());
+        EXPECT_EQ(view, page);
+    }
+};
 
 TEST_P(FirstPage, IsInViewAtOnceThoughNothingWasLaidOut) {
-    Pager* pager = open(GetParam());
-    EXPECT_EQ(GetParam(), pager->inView());
+    Pager* pager = openAbove();
+    EXPECT_EQ(first(), pager->inView());
+    test_ui::runFor(0.02);
+    EXPECT_EQ(first(), pager->inView());
     test_ui::runFor(1.0);
-    EXPECT_EQ(GetParam(), pager->inView());
-    EXPECT_EQ(0, test_ui::geometry(pages_[static_cast<size_t>(GetParam())]->getEvasObj()).x);
+    expectInView(*pager);
 }
 
-INSTANTIATE_TEST_SUITE_P(Pages, FirstPage, testing::Range(0, 5));
+TEST_P(FirstPage, StaysInViewWhenTheScreenTurnsSmallerOrLarger) {
+    Pager* pager = openAbove();
+    for (const auto& [width, height] : {std::pair(480, 800), std::pair(720, 1280), std::pair(1280, 720)}) {
+        evas_object_resize(naviframe_.getEvasObj(), width, height);
+        test_ui::runFor(0.5);
+        EXPECT_EQ(width, test_ui::geometry(pager->getScroller()).width);
+        expectInView(*pager);
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Pages, FirstPage, testing::Combine(testing::Values(0, 7, 14), testing::Bool()));
 
 TEST_F(PageSlideView, ShowsAPageAtOnceAndOnlyOneThatExists) {
     Pager* pager = open(0);

@@ -54,6 +54,7 @@ class Pager : public app_assist::WPageSlideView {
 public:
     Pager(std::vector<app_assist::WView*> pages, int first) : pages_(std::move(pages)), first_(first) {}
 
+    bool onTop = true;  ///< pushed with a transition; else inserted without one
     int inView() const {
         int page = -1;
         elm_scroller_current_page_get(getScroller(), &page, nullptr);
@@ -68,6 +69,13 @@ protected:
         elm_box_pack_end(layout, scroller);
         evas_object_show(scroller);
         return layout;
+    }
+    Elm_Object_Item* onPushToNaviframe(Evas_Object* naviframe) override {
+        Evas_Object* back = elm_button_add(naviframe);
+        if (onTop)
+            return elm_naviframe_item_push(naviframe, nullptr, back, nullptr, getEvasObj(), nullptr);
+        return elm_naviframe_item_insert_after(naviframe, elm_naviframe_top_item_get(naviframe), nullptr, back, nullptr,
+                                               getEvasObj(), nullptr);
     }
     void onPushed(Elm_Object_Item*) override {
         for (app_assist::WView* page : pages_)
@@ -96,21 +104,16 @@ protected:
         return page;
     }
     /// Pushes a pager of these pages, opened at `first`, and lets it move in.
-    Pager* open(int first, int count = 5) {
+    Pager* open(int first, int count = 5, bool onTop = true) {
         while (static_cast<int>(pages_.size()) < count)
             make(std::to_string(pages_.size()));
         auto* pager = new Pager({pages_.begin(), pages_.end()}, first);
+        pager->onTop = onTop;
         naviframe_.push(pager, nullptr, nullptr);
         return pager;
     }
     void swipeLeft() { screen().swipe({600, 700}, {150, 700}); }
     void swipeRight() { screen().swipe({150, 700}, {600, 700}); }
-
-    /// Counts an event of the pager's scroller from now on.
-    void count(Pager& pager, const char* event, int& counter) {
-        evas_object_smart_callback_add(
-            pager.getScroller(), event, [](void* data, Evas_Object*, void*) { ++*static_cast<int*>(data); }, &counter);
-    }
 
     Story told() { return std::exchange(story_, {}); }
 

@@ -17,41 +17,6 @@ TEST_F(PageSwipe, ASwipeTurnsOnePageHoweverHardItIs) {
     EXPECT_EQ(1, pager->inView());
 }
 
-TEST_F(PageSwipe, ATurnOfThePageStartsAndStopsOnce) {
-    Pager* pager = open(1);
-    test_ui::runFor(0.5);
-    int starts = 0, stops = 0;
-    count(*pager, "scroll,anim,start", starts);
-    count(*pager, "scroll,anim,stop", stops);
-    swipeLeft();
-    test_ui::runFor(2.0);
-    EXPECT_EQ(1, starts);
-    EXPECT_EQ(1, stops);
-    EXPECT_EQ(2, pager->inView());
-}
-
-TEST_F(PageSwipe, ABounceAtEitherEndComesToRest) {
-    Pager* pager = open(0, 2);
-    test_ui::runFor(0.5);
-    int starts = 0, stops = 0;
-    count(*pager, "scroll,anim,start", starts);
-    count(*pager, "scroll,anim,stop", stops);
-    for (const int end : {0, 1}) {
-        pager->showPage(end, false);
-        test_ui::runFor(0.5);
-        starts = stops = 0;
-        end == 0 ? swipeRight() : swipeLeft();
-        test_ui::runFor(0.5);
-        EXPECT_EQ(end, pager->inView());
-        EXPECT_EQ(0, test_ui::geometry(pages_[static_cast<size_t>(end)]->getEvasObj()).x);
-        EXPECT_EQ(1, starts);
-        // The end of the bounce, and the end of the animation that EFL would leave going.
-        EXPECT_EQ(2, stops);
-        test_ui::runFor(3.0);
-        EXPECT_EQ(2, stops);
-    }
-}
-
 TEST_F(PageSwipe, ASecondSwipeTakesOverFromTheFirst) {
     Pager* pager = open(0);
     test_ui::runFor(0.5);
@@ -73,15 +38,6 @@ TEST_F(PageSwipe, AFingerThatHoldsAMovingPageHoldsIt) {
     test_ui::runFor(1.0);
     const int settled = test_ui::geometry(pages_[static_cast<size_t>(pager->inView())]->getEvasObj()).x;
     EXPECT_EQ(0, settled);
-}
-
-TEST_F(PageSwipe, OnePageOnlyBounces) {
-    Pager* pager = open(0, 1);
-    test_ui::runFor(0.5);
-    swipeLeft();
-    test_ui::runFor(2.0);
-    EXPECT_EQ(0, pager->inView());
-    EXPECT_EQ(0, test_ui::geometry(pages_[0]->getEvasObj()).x);
 }
 
 TEST_F(PageSwipe, ASwipeThatBeginsOnTextTurnsThePage) {

@@ -40,6 +40,18 @@ TEST(DisplayLanguageName, IsEmptyForWhatWouldLeadOutOfTheCatalogues) {
         EXPECT_EQ("", DisplayLanguage(name).name()) << name;
 }
 
+TEST(DisplayLanguageDirection, IsRightToLeftWhereItsScriptIs) {
+    for (const char* name : {"ar", "ar_EG", "ar_EG.UTF-8", "fa_IR", "he_IL", "ur_PK", "ps_AF", "ug_CN", "yi_US",
+                             "dv_MV", "pa_PK", "uz_AF", "az@arabic"})
+        EXPECT_TRUE(DisplayLanguage(name).isRightToLeft()) << name;
+}
+
+TEST(DisplayLanguageDirection, IsLeftToRightInAllOthers) {
+    for (const char* name : {"", "C", "en_US", "ko_KR.UTF-8", "ru_RU", "de_DE@euro", "hi_IN", "id_ID", "zh_CN", "pa_IN",
+                             "uz_UZ", "ks_IN@devanagari", "ug_CN@latin", "xx_YY"})
+        EXPECT_FALSE(DisplayLanguage(name).isRightToLeft()) << name;
+}
+
 /// A workstation on which only these locales exist, besides the one that every Debian has.
 struct Workstation {
     const char* what;

@@ -4,23 +4,26 @@
 
 namespace app_assist {
 
-/// Ends what EFL leaves going: after a sideways bounce at the first or last page it goes on to animate a scroller
-/// that stands still, and says "scroll,anim,stop" at every frame, for ever. With the guard it says so twice at once:
-/// when the bounce ends, and when its animation is taken away.
+/// Pairs a scroller's "scroll,anim,start" and "scroll,anim,stop": each movement ends once. EFL goes on to animate a
+/// scroller that stands still after a sideways bounce at its first or last page, and says "scroll,anim,stop" at every
+/// frame, for ever. The guard ends that animation, and nobody who listens after it hears the surplus stops, nor
+/// anything of a scroller that goes.
 class BounceGuard {
 public:
-    /// For as long as the scroller lives.
+    /// For as long as the scroller lives. To be called before others listen to the scroller.
     static void attach(Evas_Object* scroller);
 
 private:
     explicit BounceGuard(Evas_Object* scroller) : scroller_(scroller) {}
+    void started();
     void stopped();
     void stayHere();
+    void hush() const;
 
     Evas_Object* scroller_;
     Ecore_Job* job_ = nullptr;
     bool moving_ = false;
-    bool held_ = false;
+    bool going_ = false;
 };
 
 }  // namespace app_assist

@@ -29,6 +29,11 @@ void forEachInside(Evas_Object* object, std::string_view type, const Visit& visi
     }
 }
 
+/// What in an entry moves the cursor. The entry itself must not be frozen: it would not even hear of its own end.
+Evas_Object* textOf(const Evas_Object* entry) {
+    return const_cast<Evas_Object*>(edje_object_part_object_get(elm_layout_edje_get(entry), "elm.text"));
+}
+
 }  // namespace
 
 void DragGuard::attach(Evas_Object* scroller) {
@@ -61,10 +66,11 @@ void DragGuard::attach(Evas_Object* scroller) {
 
 void DragGuard::dragBegins() {
     forEachInside(scroller_, "Elm_Entry", [](Evas_Object* entry) {
-        if (evas_object_freeze_events_get(entry))
+        Evas_Object* text = textOf(entry);
+        if (!text || evas_object_freeze_events_get(text))
             return;
-        evas_object_data_set(entry, frozenKey, entry);
-        evas_object_freeze_events_set(entry, EINA_TRUE);
+        evas_object_data_set(text, frozenKey, text);
+        evas_object_freeze_events_set(text, EINA_TRUE);
     });
 }
 
@@ -77,8 +83,9 @@ void DragGuard::dragEnds() {
 void DragGuard::release() {
     job_ = nullptr;
     forEachInside(scroller_, "Elm_Entry", [](Evas_Object* entry) {
-        if (evas_object_data_del(entry, frozenKey))
-            evas_object_freeze_events_set(entry, EINA_FALSE);
+        Evas_Object* text = textOf(entry);
+        if (text && evas_object_data_del(text, frozenKey))
+            evas_object_freeze_events_set(text, EINA_FALSE);
     });
 }
 

@@ -181,7 +181,9 @@ void Runtime::catchUp() {
 
 void Runtime::useLanguage() {
     language_ = device_->language();
-    DisplayLanguage(language_).use();
+    const DisplayLanguage language(language_);
+    language.use();
+    elm_config_mirrored_set(language.isRightToLeft());
 }
 
 void Runtime::useTheme() {

@@ -15,6 +15,8 @@ WPageSlideView::WPageSlideView() = default;
 WPageSlideView::~WPageSlideView() {
     for (WView* page : pages_)
         page->book_ = nullptr;
+    if (focusJob_)
+        ecore_job_del(focusJob_);
 }
 
 Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
@@ -26,6 +28,9 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
     BounceGuard::attach(scroller_);
     DragGuard::attach(scroller_);
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
+    evas_object_smart_callback_add(
+        scroller_, "scroll,page,changed",
+        [](void* self, Evas_Object*, void*) { static_cast<WPageSlideView*>(self)->pageTurned(); }, this);
     onInitScroller(scroller_);
     row_ = onCreateLayout(scroller_);
     elm_object_content_set(scroller_, row_);
@@ -50,18 +55,22 @@ void WPageSlideView::onInitScroller(Evas_Object* scroller) {
 }
 
 // By hand: widgets overwrite a size that they were told to have at least, so no box would make them a page wide.
+// Where reading begins at the right the first page lies there, as the scroller counts its pages.
 void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* data) {
     const auto* view = static_cast<WPageSlideView*>(data);
     int x = 0, y = 0, width = 0, height = 0;
     evas_object_geometry_get(box, &x, &y, nullptr, nullptr);
     elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, &height);
-    int count = 0;
+    const int count = static_cast<int>(eina_list_count(children->children));
+    const bool mirrored = elm_object_mirrored_get(view->scroller_);
+    int index = 0;
     const Eina_List* node = nullptr;
     void* each = nullptr;
     EINA_LIST_FOREACH(children->children, node, each) {
         Evas_Object* page = static_cast<Evas_Object_Box_Option*>(each)->obj;
-        evas_object_move(page, x + width * count++, y);
+        evas_object_move(page, x + width * (mirrored ? count - 1 - index : index), y);
         evas_object_resize(page, width, height);
+        ++index;
     }
     evas_object_size_hint_min_set(box, width * count, height);
 }
@@ -86,6 +95,8 @@ bool WPageSlideView::putInRow(WView& page) {
     page.giveAway();
     elm_box_pack_end(row_, page.getEvasObj());
     evas_object_show(page.getEvasObj());
+    elm_object_tree_focus_allow_set(page.getEvasObj(), EINA_FALSE);
+    turnFocus();
     page.onSetAsPageContent();
     if (!life.expired())
         page.onPushed(page.getNaviItem());
@@ -107,24 +118,45 @@ void WPageSlideView::showPage(int index, bool relayout) {
 void WPageSlideView::show(int index) {
     // Before its contents are laid out, a scroller shows another page than it was told.
     evas_smart_objects_calculate(evas_object_evas_get(scroller_));
-    int width = 0;
-    elm_scroller_region_get(scroller_, nullptr, nullptr, &width, nullptr);
-    waitingPage_ = width > 0 ? -1 : index;
-    if (width > 0)
+    elm_scroller_region_get(scroller_, nullptr, nullptr, &width_, nullptr);
+    pageInView_ = index;
+    if (width_ > 0)
         elm_scroller_page_show(scroller_, index, 0);
+    turnFocus();
 }
 
+void WPageSlideView::pageTurned() {
+    elm_scroller_current_page_get(scroller_, &pageInView_, nullptr);
+    turnFocus();
+}
+
+// EFL brings into view what gets the focus, and gives it to the first page when any of them is touched. Not at once:
+// it takes the place that a page had before the pages moved.
+void WPageSlideView::turnFocus() {
+    if (!focusJob_)
+        focusJob_ = ecore_job_add([](void* self) { static_cast<WPageSlideView*>(self)->focusPageInView(); }, this);
+}
+
+void WPageSlideView::focusPageInView() {
+    focusJob_ = nullptr;
+    evas_smart_objects_calculate(evas_object_evas_get(scroller_));
+    for (int i = 0; i < getPageCount(); ++i)
+        elm_object_tree_focus_allow_set(pages_[static_cast<size_t>(i)]->getEvasObj(), i == pageInView_);
+}
+
+// A scroller that gets another width stays where it was in pixels, which is another page.
 void WPageSlideView::scrollerResized(void* data, Evas*, Evas_Object*, void*) {
     auto* view = static_cast<WPageSlideView*>(data);
     elm_box_recalculate(view->row_);
-    if (view->waitingPage_ < 0)
+    int width = 0;
+    elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, nullptr);
+    if (width == view->width_)
         return;
-    const auto showWaiting = [view](WView*) {
-        if (view->waitingPage_ >= 0)
-            view->showPage(std::exchange(view->waitingPage_, -1), true);
+    const auto showAgain = [view](WView*) {
+        view->showPage(view->pageInView_, true);
         return false;
     };
-    WUiTimer::addJob(showWaiting, view, view->scroller_);
+    WUiTimer::addJob(showAgain, view, view->scroller_);
 }
 
 }  // namespace app_assist

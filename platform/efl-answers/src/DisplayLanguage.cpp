@@ -2,6 +2,9 @@
 
 #include <libintl.h>
 #include <locale.h>
+#include <unicode/uchar.h>
+#include <unicode/uloc.h>
+#include <unicode/uscript.h>
 
 #include <algorithm>
 #include <cctype>
@@ -45,6 +48,16 @@ std::string DisplayLanguage::locale() const {
     const auto at = std::min(name_.find('@'), name_.size());
     const std::string wanted = name_.substr(0, at) + codeset + name_.substr(at);
     return exists(wanted) ? wanted : anyLocale;
+}
+
+bool DisplayLanguage::isRightToLeft() const {
+    const auto at = std::min(name_.find('@'), name_.size());
+    // A modifier may name another script than the language's usual one.
+    const std::string modifier = name_.substr(std::min(at + 1, name_.size()));
+    const int script = u_getPropertyValueEnum(UCHAR_SCRIPT, modifier.c_str());
+    if (script != UCHAR_INVALID_CODE)
+        return uscript_isRightToLeft(static_cast<UScriptCode>(script));
+    return uloc_isRightToLeft(name_.substr(0, at).c_str());
 }
 
 void DisplayLanguage::use() const {

@@ -89,6 +89,10 @@ void stop() {
     ticking = false;
 }
 
+bool isAnimating() {
+    return ticking;
+}
+
 unsigned int timestamp() {
     return static_cast<unsigned int>(ecore_time_get() * 1000.0);
 }

@@ -15,6 +15,9 @@ void driveAnimations();
 /// Forgets what belongs to a main loop that is about to end.
 void stop();
 
+/// Whether something asks for frames: an animation runs.
+bool isAnimating();
+
 /// Milliseconds, as input events carry them.
 unsigned int timestamp();
 

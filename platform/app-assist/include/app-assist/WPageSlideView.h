@@ -7,6 +7,7 @@
 namespace app_assist {
 
 /// A view of pages side by side, one in view at a time, that a swipe turns. Owns the pages that were appended.
+/// Only the page in view takes the focus. On the scroller, "scroll,anim,start" and "scroll,anim,stop" come in pairs.
 class WPageSlideView : public WView {
 public:
     WPageSlideView();
@@ -37,14 +38,20 @@ private:
     bool putInRow(WView& page);
     void pageGone(const WView& page);
     void show(int index);
+    void pageTurned();
+    void turnFocus();
+    void focusPageInView();
     static void layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* view);
     static void scrollerResized(void* view, Evas*, Evas_Object*, void*);
 
     bool showScroll_ = false;
     Evas_Object* scroller_ = nullptr;
     Evas_Object* row_ = nullptr;
-    /// The page to show when the scroller gets its size; -1 for none.
-    int waitingPage_ = -1;
+    /// The page that is shown, or will be when the scroller has a width.
+    int pageInView_ = 0;
+    /// The scroller's, when that page was last shown.
+    int width_ = 0;
+    Ecore_Job* focusJob_ = nullptr;
     std::vector<WView*> pages_;
 };
 

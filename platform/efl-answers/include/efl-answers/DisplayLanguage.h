@@ -19,6 +19,8 @@ public:
     const std::string& name() const { return name_; }
     /// The locale that the C library can set for it: "ko_KR.UTF-8" where that exists, else "C.UTF-8".
     std::string locale() const;
+    /// Whether it is read from right to left, by the script that it is written in.
+    bool isRightToLeft() const;
 
     /// Binds a text domain to a folder of catalogues; its texts come as UTF-8.
     static void bindTexts(const std::string& domain, const std::string& folder);

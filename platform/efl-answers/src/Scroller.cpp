@@ -1,0 +1,17 @@
+#include "Original.h"
+
+#include <Elementary.h>
+
+/// Where reading begins at the right, EFL notes the shown page's place from the wrong side. It goes there when the
+/// contents get another size: another page would come into view. Showing the place that is shown notes it rightly.
+extern "C" void elm_scroller_page_show(Evas_Object* scroller, int column, int row) {
+    static const auto show = efl_answers::original<void(Evas_Object*, int, int)>("elm_scroller_page_show");
+    if (!show)
+        return;
+    show(scroller, column, row);
+    if (!elm_object_mirrored_get(scroller))
+        return;
+    int x = 0, y = 0, width = 0, height = 0;
+    elm_scroller_region_get(scroller, &x, &y, &width, &height);
+    elm_scroller_region_show(scroller, x, y, width, height);
+}
