@@ -83,6 +83,8 @@ const Service services[] = {
     {"app_control_get_extra_data", [](Arguments& a) { return app_control_get_extra_data(a.request, "k", &a.text); }},
     {"app_control_foreach_extra_data",
      [](Arguments& a) { return app_control_foreach_extra_data(a.request, eachExtra, nullptr); }},
+    {"app_control_send_launch_request",
+     [](Arguments& a) { return app_control_send_launch_request(a.request, nullptr, nullptr); }},
     {"app_manager_get_shared_resource_path",
      [](Arguments& a) { return app_manager_get_shared_resource_path("com.example.app", &a.text); }},
     {"preference_set_string", [](Arguments&) { return preference_set_string("key", "value"); }},
