@@ -113,6 +113,7 @@ const Service services[] = {
     {"package_info_destroy", [](Arguments& a) { return package_info_destroy(a.info); }},
     {"package_info_get_version", [](Arguments& a) { return package_info_get_version(a.info, &a.text); }},
     {"package_info_get_icon", [](Arguments& a) { return package_info_get_icon(a.info, &a.text); }},
+    {"package_info_get_label", [](Arguments& a) { return package_info_get_label(a.info, &a.text); }},
     {"package_manager_create", [](Arguments& a) { return package_manager_create(&a.packages); }},
     {"package_manager_destroy", [](Arguments& a) { return package_manager_destroy(a.packages); }},
     {"package_manager_set_event_cb",
