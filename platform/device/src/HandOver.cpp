@@ -16,12 +16,13 @@ namespace {
 using namespace std::chrono_literals;
 using Clock = std::chrono::steady_clock;
 
-constexpr auto patience = 10s;
+constexpr auto startTime = 10s;
+constexpr auto answerTime = 5s;
 constexpr auto pollInterval = 10ms;
 
 /// False when the application ends before it is on the bus.
 bool waitForName(const Bus& bus, const Folder& folder, const std::string& appId) {
-    const auto deadline = Clock::now() + patience;
+    const auto deadline = Clock::now() + startTime;
     while (!BusName::owner(bus, appId)) {
         if (!ApplicationLock::holder(folder, appId))
             return false;
@@ -40,11 +41,11 @@ bool handOver(const Folder& folder, const std::string& appId,
     keepToolkitFilesIn(folder);
     const std::unique_ptr<Bus> bus = Bus::connect(folder);
     if (!bus)
-        throw Error("there is no bus to hand the request over");
+        throw Error("there is no bus");
     if (!waitForName(*bus, folder, appId))
         return false;
     try {
-        BusCall(*bus, appId, bus::pathOf(appId), bus::applicationInterface, patience).call("Launch", {extras});
+        BusCall(*bus, appId, bus::pathOf(appId), bus::applicationInterface, answerTime).call("Launch", {extras});
         return true;
     } catch (const Error&) {
         if (!ApplicationLock::holder(folder, appId))

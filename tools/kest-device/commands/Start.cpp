@@ -24,7 +24,7 @@ struct Options {
 
 constexpr char examples[] =
     R"(Without APPID the tips application starts. KEY=VALUE words are the extras of its launch request.
-The application's own output goes to application.log in the device's folder.
+The application's own output goes to output/APPID.log in the device's folder.
 
 Where the workstation has no session bus, a private one is started for the device; 'kest-device stop' ends it.
 An application that runs already is left as it is, and that is an error.
