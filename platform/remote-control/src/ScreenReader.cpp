@@ -47,7 +47,7 @@ Pages pagesOf(const Evas_Object* scroller) {
 }
 
 bool holdsSomething(const Element& element) {
-    return !element.name.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
+    return !element.name.empty() || !element.file.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
            !element.items.empty();
 }
 
@@ -178,13 +178,14 @@ void ScreenReader::readThemed(Element& parent, Evas_Object* object, bool shown) 
 }
 
 void ScreenReader::readParts(Element& element, Evas_Object* themed, bool shown) {
-    for (const std::string& name : parts_.groupOf(themed).changing) {
-        Evas_Object* content = edje_object_part_swallow_get(themed, name.c_str());
+    for (const auto& [name, holdsContent] : parts_.groupOf(themed).changing) {
+        const char* part = name.c_str();
+        const Evas_Object* content = holdsContent ? edje_object_part_swallow_get(themed, part) : nullptr;
         // EFL hands it out as const; only its clips are asked for.
-        auto* object = content ? content : const_cast<Evas_Object*>(edje_object_part_object_get(themed, name.c_str()));
+        auto* object = const_cast<Evas_Object*>(content ? content : edje_object_part_object_get(themed, part));
         if (object) {
-            element.parts.push_back({name, orEmpty(edje_object_part_state_get(themed, name.c_str(), nullptr)),
-                                     placeOf(object), seenOf(object, shown && evas_object_visible_get(object))});
+            element.parts.push_back({name, orEmpty(edje_object_part_state_get(themed, part, nullptr)), placeOf(object),
+                                     seenOf(object, shown && evas_object_visible_get(object))});
         }
     }
 }

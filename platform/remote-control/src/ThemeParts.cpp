@@ -29,6 +29,11 @@ struct Free {
     void operator()(char* text) const { std::free(text); }
 };
 
+unsigned countStates(Evas_Object* reader, const char* part) {
+    const Names states(edje_edit_part_states_list_get(reader, part));
+    return eina_list_count(states.get());
+}
+
 void replaceAll(std::string& text, std::string_view from, std::string_view to) {
     for (std::size_t at = text.find(from); at != std::string::npos; at = text.find(from, at + to.size())) {
         text.replace(at, from.size(), to);
@@ -74,18 +79,21 @@ void ThemeParts::read(const std::string& file, const std::string& name, Group& g
     if (!reader || !edje_object_file_set(reader.get(), file.c_str(), name.c_str())) {
         return;
     }
+    const bool ofToolkit = name.starts_with("elm/");
     const Names parts(edje_edit_parts_list_get(reader.get()));
     for (const Eina_List* node = parts.get(); node; node = eina_list_next(node)) {
         const auto* part = static_cast<const char*>(eina_list_data_get(node));
         const Edje_Part_Type type = edje_edit_part_type_get(reader.get(), part);
-        const Names states(edje_edit_part_states_list_get(reader.get(), part));
         if (type == EDJE_PART_TYPE_TEXT || type == EDJE_PART_TYPE_TEXTBLOCK) {
             group.texts.emplace_back(part);
-        } else if (eina_list_count(states.get()) > 1) {
-            group.changing.emplace_back(part);
+            continue;
         }
-        if (type == EDJE_PART_TYPE_SWALLOW) {
+        const bool holdsContent = type == EDJE_PART_TYPE_SWALLOW;
+        if (holdsContent) {
             group.swallows.emplace_back(part);
+        }
+        if (!ofToolkit && countStates(reader.get(), part) > 1) {
+            group.changing.push_back({part, holdsContent});
         }
     }
 }

@@ -16,11 +16,16 @@ class ThemeParts {
 public:
     explicit ThemeParts(Evas* canvas) : canvas_(canvas) {}
 
+    /// A part that has several looks.
+    struct Changing {
+        std::string name;
+        bool holdsContent;  ///< another object stands in it
+    };
     /// What a group has.
     struct Group {
         std::vector<std::string> texts;
         std::vector<std::string> swallows;  ///< parts that hold other objects
-        std::vector<std::string> changing;  ///< parts with several looks; no texts
+        std::vector<Changing> changing;     ///< none for the groups of the toolkit's widgets; no texts
     };
 
     /// The group that draws `themed`; an empty one where that cannot be told.

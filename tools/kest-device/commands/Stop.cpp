@@ -15,8 +15,8 @@ using namespace std::chrono_literals;
 constexpr auto patience = 5s;
 
 constexpr char about[] =
-    R"(Asks every running application of the device, launched ones too, to end, and ends by force what does not within 5 seconds.
-Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
+    R"(Asks every running application of the device to end, those too that others have launched, and ends by force what does
+not within 5 seconds. Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
 
 Example:
   kest-device stop)";
