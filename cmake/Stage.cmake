@@ -1,9 +1,11 @@
 # The build tree stages what it makes as a device has it, and runs from there.
 #   stage/opt/usr/apps/<id>/   the packages that every device has
 #   stage/data/                the platform's own data: its theme and its texts
+#   stage/examples/<id>/       packages to install by hand
 set(STAGE_DIR "${CMAKE_BINARY_DIR}/stage")
 set(STAGE_APPS_DIR "${STAGE_DIR}/opt/usr/apps")
 set(STAGE_DATA_DIR "${STAGE_DIR}/data")
+set(STAGE_EXAMPLES_DIR "${STAGE_DIR}/examples")
 
 find_program(MSGFMT msgfmt REQUIRED)
 

@@ -20,6 +20,9 @@ TEST(PackageInfo, KnowsVersionAndIcon) {
         char* icon = nullptr;
         EXPECT_EQ(package_info_get_version(info, &version), PACKAGE_MANAGER_ERROR_NONE);
         EXPECT_EQ(package_info_get_icon(info, &icon), PACKAGE_MANAGER_ERROR_NONE);
+        char* label = nullptr;
+        EXPECT_EQ(package_info_get_label(info, &label), PACKAGE_MANAGER_ERROR_NONE);
+        EXPECT_EQ(owned(label), "Label of " + device.appId());
         EXPECT_EQ(owned(version), "2.1");
         EXPECT_EQ(owned(icon), device.appRoot().string() + "/shared/res/icon.png");
         EXPECT_EQ(package_info_destroy(info), PACKAGE_MANAGER_ERROR_NONE);
@@ -38,6 +41,9 @@ TEST(PackageInfo, MayLackVersionAndIcon) {
     EXPECT_EQ(owned(version), "");
     EXPECT_EQ(package_info_get_icon(info, &icon), PACKAGE_MANAGER_ERROR_NONE);
     EXPECT_EQ(icon, nullptr);
+    char* label = nullptr;
+    EXPECT_EQ(package_info_get_label(info, &label), PACKAGE_MANAGER_ERROR_NONE);
+    EXPECT_EQ(owned(label), "com.example.bare");
     package_info_destroy(info);
 }
 
@@ -67,10 +73,12 @@ TEST(PackageInfo, RefusesNull) {
     EXPECT_EQ(package_info_create("com.example.app", nullptr), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(package_info_get_version(nullptr, &text), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(package_info_get_icon(nullptr, &text), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(package_info_get_label(nullptr, &text), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(package_info_destroy(nullptr), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     ASSERT_EQ(package_info_create("com.example.app", &info), PACKAGE_MANAGER_ERROR_NONE);
     EXPECT_EQ(package_info_get_version(info, nullptr), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(package_info_get_icon(info, nullptr), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(package_info_get_label(info, nullptr), PACKAGE_MANAGER_ERROR_INVALID_PARAMETER);
     package_info_destroy(info);
 }
 

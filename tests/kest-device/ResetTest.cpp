@@ -12,12 +12,15 @@ TEST_F(Reset, MakesTheDeviceAsNew) {
     device_.must({"set", "language", "ko_KR"});
     device_.must({"install", test_tool::makePackage(device_.folder() / "game", "com.example.game", "1")});
     device::Log(device_.root() / "device.log").write(device::Log::Level::Info, "TAG", "a message");
+    device_.open().launches().append({"a.a", "b.b", {}}, device::LaunchOutcome::Started);
+    support::writeFile(device_.root() / "output/b.b.log", "the last words");
 
-    EXPECT_EQ(run({"reset"}),
-              done("the device " + root() + " is as new; removed: device.db device.log toolkit com.example.game\n"));
+    EXPECT_EQ(run({"reset"}), done("the device " + root() +
+                                   " is as new; removed: device.db device.log output toolkit com.example.game\n"));
 
     EXPECT_EQ(run({"get", "language"}), done("en_US\n"));
     EXPECT_EQ(run({"log"}), done());
+    EXPECT_EQ(run({"launches"}), done());
     EXPECT_FALSE(fs::exists(device_.root() / "opt/usr/apps/com.example.game"));
 }
 

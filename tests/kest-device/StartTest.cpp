@@ -142,7 +142,7 @@ TEST_F(Start, TheScreenIsTheOneThatIsAskedFor) {
 TEST_F(Start, AnApplicationThatEndsAtOnceIsAnErrorWithItsLastWords) {
     EXPECT_EQ(start({"mode=fails"}),
               failed("com.example.sample ended with status 3 before it was on the screen; its last words (of " +
-                     root() + "/application.log): the fruits are rotten"));
+                     root() + "/output/com.example.sample.log): the fruits are rotten"));
 
     EXPECT_THAT(device_.processes(), IsEmpty());
 }

@@ -4,6 +4,7 @@
 #include <app-assist/WWindow.h>
 #include <dlog.h>
 
+#include <cstdlib>
 #include <cstring>
 
 namespace {
@@ -33,7 +34,11 @@ class DrinksApp : public app_assist::WApp {
         getWindow()->attachBaseUiObject(new app_assist::WNaviframe(), nullptr);
         return true;
     }
-    void onAppControl(app_control_h, bool firstLaunch) override {
+    void onAppControl(app_control_h request, bool firstLaunch) override {
+        char* drink = nullptr;
+        app_control_get_extra_data(request, "drink", &drink);
+        dlog_print(DLOG_INFO, "SECOND", "asked %sfor %s", firstLaunch ? "" : "again ", drink ? drink : "nothing");
+        std::free(drink);
         if (firstLaunch)
             static_cast<app_assist::WNaviframe*>(getWindow()->getBaseUiObject())
                 ->push(new DrinksView(), "Drinks", nullptr);

@@ -49,7 +49,7 @@ void addThoseOnBus(Session& session, const std::set<std::string>& known, std::ve
             continue;
         }
         if (const std::optional<int> id = device::BusName::processOf(*bus, name)) {
-            running.push_back({name, Process(*id), true});
+            running.push_back({name, device::Process(*id), true});
         }
     }
 }
@@ -64,7 +64,7 @@ void addThoseThatDoNotAnswer(Session& session, const std::set<std::string>& know
             continue;
         }
         if (const std::optional<pid_t> process = device::ApplicationLock::holder(session.folder(), id)) {
-            running.push_back({id, Process(*process), false});
+            running.push_back({id, device::Process(*process), false});
         }
     }
 }

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Process.h"
 #include "Session.h"
 #include "device/BusCall.h"
+#include "device/Process.h"
 
 #include <optional>
 #include <string>
@@ -13,7 +13,7 @@ namespace tool {
 /// An application that runs on the device.
 struct RunningApplication {
     std::string id;
-    Process process;
+    device::Process process;
     bool onBus = true;  ///< false: it runs without a bus, or does not answer on it
 };
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Process.h"
 #include "Session.h"
+#include "device/Process.h"
 
 #include <string>
 #include <vector>
@@ -10,7 +10,7 @@ namespace tool {
 
 struct LaunchRequest {
     std::string appId;
-    std::vector<std::string> extras;  ///< each KEY=VALUE
+    std::vector<std::pair<std::string, std::string>> extras;
     bool headless = false;
 };
 
@@ -19,6 +19,6 @@ device::Package runnablePackage(device::Device& device, const std::string& appId
 
 /// Starts the package's application as a launcher does and returns when it has drawn its first screen.
 /// Throws device::Error, with the application ended, when it ends before that or takes longer than 30 seconds.
-Process launch(Session& session, const device::Package& package, const LaunchRequest& request);
+device::Process launch(Session& session, const device::Package& package, const LaunchRequest& request);
 
 }  // namespace tool

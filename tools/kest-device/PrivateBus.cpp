@@ -107,14 +107,14 @@ private:
 
 }  // namespace
 
-std::optional<Process> PrivateBus::process() const {
+std::optional<device::Process> PrivateBus::process() const {
     std::ifstream stream(folder_.busProcess());
     int id = 0;
     if (!(stream >> id) || id <= 1) {
         return std::nullopt;
     }
     // After a crash or a reboot the number may be somebody else's.
-    const Process daemon(id);
+    const device::Process daemon(id);
     const std::vector<std::string> words = daemon.arguments();
     const bool ours =
         std::find(words.begin(), words.end(), "--address=unix:path=" + escaped(recordedSocket())) != words.end();
@@ -162,17 +162,16 @@ void PrivateBus::start() const {
     const fs::path socket = chooseSocket();
     writeWhole(folder_.busAddress(), "unix:path=" + escaped(socket) + "\n");
     Pipe addresses;
-    Program daemon;
+    device::Program daemon;
     daemon.words = {program,
                     "--session",
                     "--nofork",
                     "--nopidfile",
                     "--nosyslog",
                     "--address=unix:path=" + escaped(socket),
-                    "--print-address=" + std::to_string(addresses.writing())};
-    daemon.output = "/dev/null";
+                    "--print-address=3"};
     daemon.inherited = addresses.writing();
-    const Process process = startDetached(daemon);
+    const device::Process process = device::startDetached(daemon);
     addresses.closeWriting();
     try {
         const std::string address = addresses.readLine();
@@ -189,7 +188,7 @@ void PrivateBus::start() const {
 }
 
 void PrivateBus::stop() const {
-    if (const std::optional<Process> daemon = process()) {
+    if (const std::optional<device::Process> daemon = process()) {
         daemon->end();
     }
     removeFiles();

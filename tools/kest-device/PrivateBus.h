@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Process.h"
 #include "device/Folder.h"
+#include "device/Process.h"
 
 #include <filesystem>
 #include <optional>
@@ -15,7 +15,7 @@ public:
     explicit PrivateBus(const device::Folder& folder) : folder_(folder) {}
 
     /// The daemon, as long as it runs.
-    std::optional<Process> process() const;
+    std::optional<device::Process> process() const;
     /// Starts the daemon and returns when it takes connections. What a killed daemon left behind is replaced.
     /// Throws device::Error when that fails.
     void start() const;

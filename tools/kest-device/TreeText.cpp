@@ -42,12 +42,38 @@ Json listIn(const Json& element, const char* key) {
     return element.value(key, Json::array());
 }
 
+/// The parts of widgets are always the same ones.
+std::string inPart(const Json& element) {
+    const std::string part = element.value("part", "");
+    return part.empty() || part.starts_with("elm.") ? "" : "in " + part;
+}
+
+std::string pageOf(const Json& element) {
+    const int page = element.value("page", 0);
+    return page == 0 ? "" : "page " + std::to_string(page) + " of " + std::to_string(element.value("pages", 0));
+}
+
+/// The parts that look otherwise than at first, and how.
+std::string statesOf(const Json& element) {
+    std::string words;
+    for (const Json& part : listIn(element, "parts")) {
+        const std::string state = part.value("state", "");
+        if (state != "default") {
+            words += (words.empty() ? "" : " ") + part.value("part", "") + "=" + state;
+        }
+    }
+    return words;
+}
+
 void Writer::element(int depth, const Json& element) {
     std::string words = element.value("type", "");
     append(words, element.value("name", ""));
     append(words, placeOf(element));
     append(words, element.value("group", ""));
     append(words, element.value("file", ""));
+    append(words, inPart(element));
+    append(words, pageOf(element));
+    append(words, statesOf(element));
     line(depth, words, element.value("visible", false));
     contents(depth + 1, element);
 }

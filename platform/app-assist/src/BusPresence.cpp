@@ -35,9 +35,9 @@ std::string answeringApplication(const device::Bus& bus) {
 
 }  // namespace
 
-BusPresence::BusPresence(device::Device& device, std::function<Evas_Object*()> window, std::function<void()> quit)
+BusPresence::BusPresence(device::Device& device, remote_control::Server::Application application)
     : device_(device), bus_(device::Bus::connect(device.folder())),
-      result_(bus_ ? join(std::move(window), std::move(quit)) : Result::NoBus) {
+      result_(bus_ ? join(std::move(application)) : Result::NoBus) {
     if (result_ == Result::Joined)
         device_.events().connect(*bus_);
     else
@@ -49,13 +49,13 @@ BusPresence::~BusPresence() {
 }
 
 // The names come last, the device's last of all: who finds one owned can ask its owner at once.
-BusPresence::Result BusPresence::join(std::function<Evas_Object*()> window, std::function<void()> quit) {
+BusPresence::Result BusPresence::join(remote_control::Server::Application application) {
     const std::string& appId = device_.application().id;
     bus_->onLost([this] {
         dlog_print(DLOG_WARN, logTag, "the bus is gone: remote control is off");
         leave();
     });
-    server_ = std::make_unique<remote_control::Server>(*bus_, appId, std::move(window), std::move(quit));
+    server_ = std::make_unique<remote_control::Server>(*bus_, appId, std::move(application));
     if (BusName::own(*bus_, appId, false) == BusName::Result::Taken)
         return isOwnFolder(folderOf(*bus_, appId)) ? Result::RunningAlready : Result::OtherDevice;
     if (BusName::own(*bus_, bus::deviceName, true) == BusName::Result::Owner)

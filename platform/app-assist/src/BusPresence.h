@@ -4,10 +4,8 @@
 #include <device/Device.h>
 #include <remote-control/Server.h>
 
-#include <Elementary.h>
-
-#include <functional>
 #include <memory>
+#include <string>
 
 namespace app_assist {
 
@@ -22,8 +20,7 @@ public:
         OtherDevice,     ///< the bus belongs to another device
     };
 
-    /// `window` gives the application's window at any time, `quit` ends the application.
-    BusPresence(device::Device& device, std::function<Evas_Object*()> window, std::function<void()> quit);
+    BusPresence(device::Device& device, remote_control::Server::Application application);
     ~BusPresence();
     BusPresence(const BusPresence&) = delete;
     BusPresence& operator=(const BusPresence&) = delete;
@@ -33,7 +30,7 @@ public:
     const std::string& otherFolder() const { return otherFolder_; }
 
 private:
-    Result join(std::function<Evas_Object*()> window, std::function<void()> quit);
+    Result join(remote_control::Server::Application application);
     /// Whether `folder` is this device's; keeps it when it is not.
     bool isOwnFolder(const std::string& folder);
     void leave();

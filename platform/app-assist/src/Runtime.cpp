@@ -6,10 +6,13 @@
 
 #include <app-assist/WWindow.h>
 #include <device/Error.h>
+#include <device/HandOver.h>
 #include <device/Keys.h>
 #include <device/StandardError.h>
 #include <efl-answers/DisplayLanguage.h>
 #include <uxt/Theme.h>
+
+#include <Elementary.h>
 
 #include <cstdio>
 #include <cstdlib>
@@ -101,11 +104,10 @@ bool Runtime::createApplication(int argc, char** argv) {
 }
 
 std::optional<int> Runtime::joinBus() {
-    const auto window = [this]() -> Evas_Object* {
-        return app_.getWindow() ? app_.getWindow()->getEvasObj() : nullptr;
-    };
+    const auto launch = [this](const LaunchRequest::Extras& extras) { deliver(extras); };
     try {
-        presence_.emplace(*device_, window, [] { elm_exit(); });
+        presence_.emplace(*device_,
+                          remote_control::Server::Application{[this] { return window(); }, [] { elm_exit(); }, launch});
     } catch (const device::Error& error) {
         say(std::string(error.what()) + "; remote control is off");
         return std::nullopt;
@@ -116,7 +118,8 @@ std::optional<int> Runtime::joinBus() {
                              device_->folder().root().string() + "; give each device a bus of its own");
         return 1;
     case BusPresence::Result::RunningAlready:
-        return sayRunning();
+        presence_.reset();
+        return handOver().value_or(1);
     case BusPresence::Result::NoBus:
         say("there is no bus: remote control is off");
         return std::nullopt;
@@ -127,13 +130,30 @@ std::optional<int> Runtime::joinBus() {
 }
 
 std::optional<int> Runtime::claimInstance() {
-    instance_.emplace(device_->folder(), device_->application().id);
-    return instance_->isHeld() ? std::nullopt : std::optional(sayRunning());
+    for (;;) {
+        instance_.emplace(device_->folder(), device_->application().id);
+        if (instance_->isHeld())
+            return std::nullopt;
+        if (const auto status = handOver())
+            return status;
+    }
 }
 
-int Runtime::sayRunning() const {
-    say(device_->application().id + " is running already");
-    return 0;
+std::optional<int> Runtime::handOver() {
+    const std::string& id = device_->application().id;
+    try {
+        if (!device::handOver(device_->folder(), id, extras_))
+            return std::nullopt;
+        say(id + " is running already");
+        return 0;
+    } catch (const device::Error& error) {
+        device::sayErrorOnce(id + " is running already, but the launch request cannot be handed over: " + error.what());
+        return 1;
+    }
+}
+
+Evas_Object* Runtime::window() const {
+    return app_.getWindow() ? app_.getWindow()->getEvasObj() : nullptr;
 }
 
 void Runtime::queueFirstRequest() {
@@ -155,6 +175,16 @@ void Runtime::deliver(const LaunchRequest::Extras& extras) {
     app_.onAppControl(request.handle(), first);
     if (first)
         app_.beginSight();
+    else
+        raiseWindow();
+}
+
+void Runtime::raiseWindow() const {
+    if (Evas_Object* raised = window()) {
+        elm_win_iconified_set(raised, EINA_FALSE);
+        elm_win_raise(raised);
+        elm_win_activate(raised);
+    }
 }
 
 void Runtime::followDevice() {

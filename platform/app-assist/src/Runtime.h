@@ -32,12 +32,15 @@ private:
     void startToolkit(int argc, char** argv);
     bool createApplication(int argc, char** argv);
     std::optional<int> joinBus();
-    /// An exit status where another process is the application.
+    /// An exit status where another process is the application, which then has this one's launch request.
     std::optional<int> claimInstance();
-    /// The exit status of a second process.
-    int sayRunning() const;
+    /// The exit status of a second process; nullopt when the first has ended meanwhile.
+    std::optional<int> handOver();
     void queueFirstRequest();
     void deliver(const LaunchRequest::Extras& extras);
+    void raiseWindow() const;
+    /// The application's; null when there is none.
+    Evas_Object* window() const;
     void followDevice();
     void settingChanged(const std::string& key);
     /// What changed before the device could tell of it.

@@ -12,7 +12,12 @@ typedef enum {
     APP_CONTROL_ERROR_NONE = TIZEN_ERROR_NONE,
     APP_CONTROL_ERROR_INVALID_PARAMETER = TIZEN_ERROR_INVALID_PARAMETER,
     APP_CONTROL_ERROR_OUT_OF_MEMORY = TIZEN_ERROR_OUT_OF_MEMORY,
-    APP_CONTROL_ERROR_KEY_NOT_FOUND = TIZEN_ERROR_KEY_NOT_AVAILABLE
+    APP_CONTROL_ERROR_IO_ERROR = TIZEN_ERROR_IO_ERROR,
+    APP_CONTROL_ERROR_NOT_SUPPORTED = TIZEN_ERROR_NOT_SUPPORTED,
+    APP_CONTROL_ERROR_KEY_NOT_FOUND = TIZEN_ERROR_KEY_NOT_AVAILABLE,
+    APP_CONTROL_ERROR_APP_NOT_FOUND = -0x01100000 | 0x21,
+    APP_CONTROL_ERROR_LAUNCH_REJECTED = -0x01100000 | 0x23,
+    APP_CONTROL_ERROR_LAUNCH_FAILED = -0x01100000 | 0x24
 } app_control_error_e;
 
 /** A launch request: an application id and string extras. Opaque. */
@@ -65,6 +70,30 @@ typedef bool (*app_control_extra_data_cb)(app_control_h app_control, const char*
  * @return APP_CONTROL_ERROR_NONE, also when the callback ended it; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
  */
 int app_control_foreach_extra_data(app_control_h app_control, app_control_extra_data_cb callback, void* user_data);
+
+typedef enum {
+    APP_CONTROL_RESULT_APP_STARTED = 1,
+    APP_CONTROL_RESULT_SUCCEEDED = 0,
+    APP_CONTROL_RESULT_FAILED = -1,
+    APP_CONTROL_RESULT_CANCELED = -2
+} app_control_result_e;
+
+/** Told of the answer to a launch request. */
+typedef void (*app_control_reply_cb)(app_control_h request, app_control_h reply, app_control_result_e result,
+                                     void* user_data);
+
+/**
+ * Has the application that the request names started with the request's extras, or, when it runs already, told of
+ * them, and comes back as soon as its program is loaded: it does not wait for the application. What has come of it
+ * stands in the device's record of launches.
+ * @param callback must be NULL: applications do not answer requests here
+ * @return APP_CONTROL_ERROR_NONE when the application has been started or is being told; APP_NOT_FOUND when none is
+ *         named or installed under that id, or it has no program; LAUNCH_REJECTED when an extra is not UTF-8, has a
+ *         "=" in its key, or all are larger than 64 KiB; LAUNCH_FAILED when the program cannot be started or the
+ *         package's manifest is broken; NOT_SUPPORTED for a callback; INVALID_PARAMETER for a NULL request;
+ *         OUT_OF_MEMORY; IO_ERROR when the device cannot be opened or the process is no application
+ */
+int app_control_send_launch_request(app_control_h app_control, app_control_reply_cb callback, void* user_data);
 
 #ifdef __cplusplus
 }

@@ -43,6 +43,13 @@ int package_info_get_version(package_info_h info, char** version);
  */
 int package_info_get_icon(package_info_h info, char** path);
 
+/**
+ * Gives the name of the package's application, for people.
+ * @param[out] label the package's id where the manifest gives none; to be freed with free(); untouched on error
+ * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ */
+int package_info_get_label(package_info_h info, char** label);
+
 #ifdef __cplusplus
 }
 #endif

@@ -4,7 +4,24 @@
 
 #include <map>
 #include <memory>
-#include <vector>
+
+namespace {
+
+int codeOf(device::Launcher::Result result) {
+    switch (result) {
+    case device::Launcher::Result::Accepted:
+        return APP_CONTROL_ERROR_NONE;
+    case device::Launcher::Result::NotFound:
+        return APP_CONTROL_ERROR_APP_NOT_FOUND;
+    case device::Launcher::Result::Rejected:
+        return APP_CONTROL_ERROR_LAUNCH_REJECTED;
+    case device::Launcher::Result::Failed:
+        return APP_CONTROL_ERROR_LAUNCH_FAILED;
+    }
+    return APP_CONTROL_ERROR_LAUNCH_FAILED;
+}
+
+}  // namespace
 
 struct app_control_s {
     std::string appId;
@@ -78,5 +95,16 @@ int app_control_foreach_extra_data(app_control_h app_control, app_control_extra_
             if (!callback(app_control, key.c_str(), user_data))
                 break;
         return APP_CONTROL_ERROR_NONE;
+    });
+}
+
+int app_control_send_launch_request(app_control_h app_control, app_control_reply_cb callback, void*) {
+    return service::callOnDevice("app_control_send_launch_request", [&](device::Device& device) -> int {
+        if (!app_control)
+            return APP_CONTROL_ERROR_INVALID_PARAMETER;
+        if (callback)
+            return APP_CONTROL_ERROR_NOT_SUPPORTED;
+        return codeOf(device.launcher().launch(
+            {device.application().id, app_control->appId, {app_control->extras.begin(), app_control->extras.end()}}));
     });
 }

@@ -60,3 +60,12 @@ int package_info_get_icon(package_info_h info, char** path) {
         return PACKAGE_MANAGER_ERROR_NONE;
     });
 }
+
+int package_info_get_label(package_info_h info, char** label) {
+    return service::call("package_info_get_label", [&]() -> int {
+        if (!info || !label)
+            return PACKAGE_MANAGER_ERROR_INVALID_PARAMETER;
+        *label = service::copyOf(info->package.label);
+        return PACKAGE_MANAGER_ERROR_NONE;
+    });
+}

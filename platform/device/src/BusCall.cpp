@@ -43,6 +43,26 @@ struct Appender {
         const dbus_bool_t value = truth ? TRUE : FALSE;
         append(DBUS_TYPE_BOOLEAN, &value);
     }
+    void operator()(const BusCall::Texts& texts) const {
+        DBusMessageIter dictionary;
+        DBusMessageIter entry;
+        open(arguments, DBUS_TYPE_ARRAY, "{ss}", dictionary);
+        for (const auto& [key, value] : texts) {
+            open(&dictionary, DBUS_TYPE_DICT_ENTRY, nullptr, entry);
+            Appender{&entry}(key);
+            Appender{&entry}(value);
+            close(&dictionary, entry);
+        }
+        close(arguments, dictionary);
+    }
+    static void open(DBusMessageIter* outer, int type, const char* signature, DBusMessageIter& inner) {
+        if (!dbus_message_iter_open_container(outer, type, signature, &inner))
+            throw std::bad_alloc();
+    }
+    static void close(DBusMessageIter* outer, DBusMessageIter& inner) {
+        if (!dbus_message_iter_close_container(outer, &inner))
+            throw std::bad_alloc();
+    }
     void append(int type, const void* value) const {
         if (!dbus_message_iter_append_basic(arguments, type, value))
             throw std::bad_alloc();

@@ -3,9 +3,9 @@
 #include "DatabaseFailure.h"
 #include "DatabaseHealth.h"
 #include "Files.h"
+#include "Schema.h"
 #include "device/Error.h"
 #include "device/Folder.h"
-#include "device/Keys.h"
 
 #include <fcntl.h>
 #include <sqlite3.h>
@@ -15,30 +15,6 @@ namespace device {
 namespace {
 
 constexpr int busyTimeoutInMilliseconds = 5000;
-
-constexpr char schema[] = R"(
-CREATE TABLE setting (key TEXT PRIMARY KEY NOT NULL, value TEXT NOT NULL);
-CREATE TABLE preference (app_id TEXT NOT NULL, key TEXT NOT NULL, value TEXT NOT NULL, PRIMARY KEY (app_id, key));
-CREATE TABLE package (id TEXT PRIMARY KEY NOT NULL, state TEXT NOT NULL CHECK (state IN ('installed', 'removed')));
-CREATE TABLE usage (
-    id INTEGER PRIMARY KEY AUTOINCREMENT, time TEXT NOT NULL, uri TEXT NOT NULL, record TEXT NOT NULL);
-)";
-
-void createSchema(SQLite::Database& sql) {
-    SQLite::Transaction transaction(sql, SQLite::TransactionBehavior::IMMEDIATE);
-    sql.exec(schema);
-    SQLite::Statement setting(sql, "INSERT INTO setting (key, value) VALUES (?, ?)");
-    for (const auto& [key, value] :
-         {std::pair(keys::language, keys::defaultLanguage), std::pair(keys::theme, keys::defaultTheme),
-          std::pair(keys::screen, keys::defaultScreen)}) {
-        setting.bind(1, key);
-        setting.bind(2, value);
-        setting.exec();
-        setting.reset();
-    }
-    sql.exec("PRAGMA user_version = " + std::to_string(schemaVersion));
-    transaction.commit();
-}
 
 void useWriteAheadLog(SQLite::Database& sql, const std::filesystem::path& file) {
     sql.exec("PRAGMA synchronous = NORMAL");
@@ -67,8 +43,8 @@ Database::Query::~Query() {
     std::ignore = statement_.tryReset();
 }
 
-Database::Impatience::Impatience(Database& database) : database_(database) {
-    sqlite3_busy_timeout(database_.sql().getHandle(), 0);
+Database::Impatience::Impatience(Database& database, std::chrono::milliseconds patience) : database_(database) {
+    sqlite3_busy_timeout(database_.sql().getHandle(), static_cast<int>(patience.count()));
 }
 
 Database::Impatience::~Impatience() {
@@ -89,8 +65,7 @@ Database::Database(const Folder& folder, Check check)
         damage = damageOf(*sql_, file_, thorough);
         if (damage.empty()) {
             useWriteAheadLog(*sql_, file_);
-            if (isFresh(*sql_))
-                createSchema(*sql_);
+            upgradeSchema(*sql_);
         }
     } catch (const SQLite::Exception& failure) {
         if (!tellsOfDamage(failure))

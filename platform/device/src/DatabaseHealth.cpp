@@ -1,6 +1,7 @@
 #include "DatabaseHealth.h"
 
 #include "DatabaseFailure.h"
+#include "Schema.h"
 #include "device/Error.h"
 
 #include <algorithm>
@@ -51,13 +52,10 @@ std::string damageFound(SQLite::Database& sql, const std::filesystem::path& file
         throw Error(file.string() + ": was made by a newer version of this software (schema " +
                     std::to_string(version) + ", this one knows " + std::to_string(schemaVersion) +
                     "); use that version, or another folder with KEST_DEVICE");
-    const int tables = sql.execAndGet("SELECT count(*) FROM sqlite_schema WHERE type = 'table' AND name IN "
-                                      "('setting', 'preference', 'package', 'usage')")
-                           .getInt();
     const bool fresh = version == 0 && isFresh(sql);
     if (fresh && isCutShort(file))
         return "it is cut short";
-    if (!fresh && (version != schemaVersion || tables != 4))
+    if (!fresh && !hasTablesOf(sql, version))
         return "it is no database of a device";
     if (isReadOnly(sql)) {
         if (access(file.c_str(), W_OK) == 0)
@@ -97,10 +95,6 @@ std::filesystem::path unusedName(const std::filesystem::path& file) {
 }
 
 }  // namespace
-
-bool isFresh(SQLite::Database& sql) {
-    return sql.execAndGet("SELECT count(*) FROM sqlite_schema").getInt() == 0;
-}
 
 std::string damageOf(SQLite::Database& sql, const std::filesystem::path& file, bool thorough) {
     KeepLogOnClose keep(sql);

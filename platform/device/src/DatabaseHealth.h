@@ -7,12 +7,6 @@
 
 namespace device {
 
-/// The schema's version that this build writes and reads.
-inline constexpr int schemaVersion = 1;
-
-/// Whether nothing has been stored yet, not even a table.
-bool isFresh(SQLite::Database& sql);
-
 /// What is wrong with the database, "" when nothing was found. Leaves the files as they are, whatever it finds.
 /// `thorough`: reads every page. Throws SQLite::Exception, and Error for what is no damage (a newer version).
 std::string damageOf(SQLite::Database& sql, const std::filesystem::path& file, bool thorough);

@@ -42,8 +42,8 @@ Device::Options Device::Options::standard() {
 Device::Device(Options options)
     : options_(withFolder(std::move(options))), database_(options_.folder, options_.check),
       settings_(database_, events_), preferences_(database_),
-      packages_(database_, events_, options_.folder, options_.preinstalled), usage_(database_),
-      log_(options_.folder.log()) {}
+      packages_(database_, events_, options_.folder, options_.preinstalled), usage_(database_), launches_(database_),
+      log_(options_.folder.log()), launcher_(*this) {}
 
 Device::~Device() = default;
 

@@ -1,33 +1,18 @@
 #include "device/Usage.h"
 
+#include "JsonText.h"
 #include "device/Database.h"
 
-#include <string_view>
-
 namespace device {
-namespace {
-
-/// SQLite makes and reads the JSON text: it keeps bytes that are not UTF-8, which a JSON library refuses.
-std::string insertStatement(std::size_t values) {
-    std::string rows;
-    for (std::size_t row = 0; row < values; ++row)
-        rows += row == 0 ? "(?, ?)" : ", (?, ?)";
-    const std::string record =
-        values == 0 ? "'{}'" : "(SELECT json_group_object(column1, column2) FROM (VALUES " + rows + "))";
-    return "INSERT INTO usage (time, uri, record) VALUES (strftime('%Y-%m-%dT%H:%M:%fZ', 'now'), ?, " + record + ")";
-}
-
-}  // namespace
 
 long long Usage::append(const std::string& uri, const std::vector<std::pair<std::string, std::string>>& values) {
     return database_.guarded([&] {
-        SQLite::Statement insert(database_.sql(), insertStatement(values.size()));
+        SQLite::Statement insert(database_.sql(), "INSERT INTO usage (time, uri, record) "
+                                                  "VALUES (strftime('%Y-%m-%dT%H:%M:%fZ', 'now'), ?, " +
+                                                      jsonObjectOf(values.size()) + ")");
         int index = 0;
         insert.bind(++index, uri);
-        for (const auto& [key, value] : values) {
-            insert.bind(++index, key);
-            insert.bind(++index, value);
-        }
+        bindPairs(insert, index, values);
         insert.exec();
         return static_cast<long long>(database_.sql().getLastInsertRowid());
     });

@@ -18,6 +18,20 @@ struct Text {
     Evas_Object* object = nullptr;  ///< what draws it; null for a row that is out of sight
 };
 
+/// A part of a theme's group that has several looks, such as a mark that comes and goes.
+struct Part {
+    std::string name;
+    std::string state;  ///< the look's name in the theme
+    Rectangle place;
+    Rectangle seen;
+};
+
+/// Which page a scroller that stops at pages is at.
+struct Pages {
+    int current = 0;  ///< counts from 1; 0 for a scroller without pages
+    int count = 0;
+};
+
 /// An item of a naviframe's stack.
 struct StackItem {
     std::string title;
@@ -34,9 +48,13 @@ struct Element {
     std::string style;  ///< style of a widget
     std::string group;  ///< group of the theme that draws it
     std::string file;   ///< picture that an image shows
+    std::string part;   ///< name of the theme's part that it stands in; empty when it is in none
     Rectangle place;
     Rectangle seen;
+    Evas_Object* object = nullptr;
+    Pages pages;
     std::vector<Text> texts;
+    std::vector<Part> parts;
     std::vector<StackItem> items;
     std::vector<Row> rows;
     std::vector<Element> children;

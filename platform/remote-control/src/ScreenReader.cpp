@@ -28,8 +28,26 @@ bool opaqueEnough(const Evas_Object* object) {
     return alpha > 0;
 }
 
+bool stopsAtPages(int size, double relative) {
+    return size > 0 || relative > 0;
+}
+
+/// In the direction in which it stops at pages; where it does in both, from left to right.
+Pages pagesOf(const Evas_Object* scroller) {
+    int width = 0, height = 0, column = 0, row = 0, lastColumn = 0, lastRow = 0;
+    double relativeWidth = 0, relativeHeight = 0;
+    elm_scroller_page_size_get(scroller, &width, &height);
+    elm_scroller_page_relative_get(scroller, &relativeWidth, &relativeHeight);
+    elm_scroller_current_page_get(scroller, &column, &row);
+    elm_scroller_last_page_get(scroller, &lastColumn, &lastRow);
+    if (stopsAtPages(width, relativeWidth)) {
+        return {column + 1, lastColumn + 1};
+    }
+    return stopsAtPages(height, relativeHeight) ? Pages{row + 1, lastRow + 1} : Pages{};
+}
+
 bool holdsSomething(const Element& element) {
-    return !element.name.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
+    return !element.name.empty() || !element.file.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
            !element.items.empty();
 }
 
@@ -62,6 +80,7 @@ private:
     void readInto(Element& parent, Evas_Object* object, bool parentShown);
     Element readWidget(Evas_Object* object, bool shown);
     void readThemed(Element& parent, Evas_Object* object, bool shown);
+    void readParts(Element& element, Evas_Object* themed, bool shown);
     void readText(Element& parent, Evas_Object* object, const std::string& text, bool shown);
     static void readStack(Element& element, Evas_Object* naviframe);
     Rectangle seenOf(Evas_Object* object, bool shown) const;
@@ -111,6 +130,7 @@ Element ScreenReader::readWidget(Evas_Object* object, bool shown) {
     element.type = orEmpty(elm_object_widget_type_get(object));
     element.name = orEmpty(evas_object_name_get(object));
     element.style = orEmpty(elm_object_style_get(object));
+    element.object = object;
     element.place = placeOf(object);
     element.seen = seenOf(object, shown);
     if (element.type == "Elm_Image" || element.type == "Elm_Icon") {
@@ -125,6 +145,8 @@ Element ScreenReader::readWidget(Evas_Object* object, bool shown) {
         readStack(element, object);
     } else if (element.type == "Elm_Genlist") {
         readRows(element, object, parts_);
+    } else if (element.type == "Elm_Scroller") {
+        element.pages = pagesOf(object);
     }
     return element;
 }
@@ -141,18 +163,30 @@ void ScreenReader::readThemed(Element& parent, Evas_Object* object, bool shown) 
     Element& element = widgetsOwn ? parent : own;
     element.group = orEmpty(group);
     if (!widgetsOwn) {
+        element.object = object;
         element.place = placeOf(object);
         element.seen = seenOf(object, shown);
     }
-    const std::size_t firstText = element.texts.size();
     for (Evas_Object* member : membersOf(object)) {
         readInto(element, member, shown);
     }
-    if (element.texts.size() > firstText) {
-        parts_.nameParts(object, element.texts);
-    }
+    parts_.nameParts(object, element);
+    readParts(element, object, shown);
     if (!widgetsOwn && (holdsSomething(own) || isRow(own))) {
         parent.children.push_back(std::move(own));
+    }
+}
+
+void ScreenReader::readParts(Element& element, Evas_Object* themed, bool shown) {
+    for (const auto& [name, holdsContent] : parts_.groupOf(themed).changing) {
+        const char* part = name.c_str();
+        const Evas_Object* content = holdsContent ? edje_object_part_swallow_get(themed, part) : nullptr;
+        // EFL hands it out as const; only its clips are asked for.
+        auto* object = const_cast<Evas_Object*>(content ? content : edje_object_part_object_get(themed, part));
+        if (object) {
+            element.parts.push_back({name, orEmpty(edje_object_part_state_get(themed, part, nullptr)), placeOf(object),
+                                     seenOf(object, shown && evas_object_visible_get(object))});
+        }
     }
 }
 

@@ -1,18 +1,17 @@
 #include "remote-control/Server.h"
 
 #include "ActionQueue.h"
+#include "ApplicationService.h"
 #include "Condition.h"
 #include "Element.h"
-#include "Guarded.h"
 #include "Input.h"
+#include "Requests.h"
 #include "Screenshot.h"
 #include "TextSearch.h"
 #include "TreeJson.h"
 #include "device/Bus.h"
 #include "device/Error.h"
-#include "device/Folder.h"
 
-#include <Ecore.h>
 #include <Eldbus.h>
 
 #include <vector>
@@ -21,44 +20,16 @@ namespace remote_control {
 
 namespace {
 
-constexpr char errorName[] = "com.ravella.device.Error.Failed";
 constexpr char stateKey[] = "remote-control";
 
 using Steps = std::function<std::vector<Playback::Step>(Evas* canvas)>;
 
-struct MessageUnref {
-    void operator()(Eldbus_Message* message) const { eldbus_message_unref(message); }
-};
-
-/// EFL hands requests out as const; keeping one changes nothing but its counter.
-std::shared_ptr<Eldbus_Message> keep(const Eldbus_Message* request) {
-    return {eldbus_message_ref(const_cast<Eldbus_Message*>(request)), MessageUnref()};
-}
-
-/// The answer that `work` makes, or an error with what it threw.
-template <typename Work>
-Eldbus_Message* answer(const Eldbus_Message* request, Work&& work) noexcept {
-    try {
-        return work();
-    } catch (const std::exception& error) {
-        return eldbus_message_error_new(request, errorName, error.what());
-    }
-}
-
-template <typename... Out>
-void arguments(const Eldbus_Message* request, const char* signature, Out... out) {
-    if (!eldbus_message_arguments_get(request, signature, out...)) {
-        throw device::Error(std::string(eldbus_message_member_get(request)) + " takes the arguments \"" + signature +
-                            "\", not \"" + eldbus_message_signature_get(request) + "\"");
-    }
-}
-
 }  // namespace
 
 struct Server::State {
-    State(device::Bus& deviceBus, const std::string& id, std::function<Evas_Object*()> windowOfNow,
-          std::function<void()> endApplication)
-        : bus(deviceBus), appId(id), window(std::move(windowOfNow)), quit(std::move(endApplication)),
+    State(device::Bus& deviceBus, const std::string& id, Application asked)
+        : bus(deviceBus), appId(id), window(std::move(asked.window)),
+          application(deviceBus, id, std::move(asked.quit), std::move(asked.launch)),
           actions([this] { return evas_object_evas_get(requireWindow()); }) {}
     ~State();
 
@@ -71,33 +42,24 @@ struct Server::State {
         return *static_cast<State*>(eldbus_service_object_data_get(interface, stateKey));
     }
     using Method = Eldbus_Message*(const Eldbus_Service_Interface*, const Eldbus_Message*);
-    static Method onQuit, onTree, onTap, onTapText, onSwipe, onKey, onHas, onScreenshot, onSettle;
-    static Eina_Bool folder(const Eldbus_Service_Interface* interface, const char* property, Eldbus_Message_Iter* value,
-                            const Eldbus_Message* request, Eldbus_Message** error);
+    static Method onTree, onTap, onTapText, onSwipe, onKey, onHas, onScreenshot, onSettle;
 
     device::Bus& bus;
     const std::string appId;
     const std::function<Evas_Object*()> window;
-    const std::function<void()> quit;
+    ApplicationService application;
     ActionQueue actions;
-    Eldbus_Service_Interface* application = nullptr;
     Eldbus_Service_Interface* screen = nullptr;
-    Ecore_Job* quitJob = nullptr;
 };
 
-Server::Server(device::Bus& bus, const std::string& appId, std::function<Evas_Object*()> window,
-               std::function<void()> quit)
-    : state_(std::make_unique<State>(bus, appId, std::move(window), std::move(quit))) {
+Server::Server(device::Bus& bus, const std::string& appId, Application application)
+    : state_(std::make_unique<State>(bus, appId, std::move(application))) {
     state_->exportObject();
 }
 
 Server::~Server() = default;
 
 void Server::State::exportObject() {
-    static const Eldbus_Method applicationMethods[] = {{"Quit", nullptr, nullptr, onQuit, 0}, {}};
-    static const Eldbus_Property applicationProperties[] = {{"Folder", "s", folder, nullptr, 0}, {}};
-    static const Eldbus_Service_Interface_Desc applicationDescription = {
-        device::bus::applicationInterface, applicationMethods, nullptr, applicationProperties, nullptr, nullptr};
     static const Eldbus_Method screenMethods[] = {
         {"Tree", nullptr, ELDBUS_ARGS({"s", "json"}), onTree, 0},
         {"Tap", ELDBUS_ARGS({"i", "x"}, {"i", "y"}), nullptr, onTap, 0},
@@ -112,23 +74,16 @@ void Server::State::exportObject() {
     static const Eldbus_Service_Interface_Desc screenDescription = {
         device::bus::screenInterface, screenMethods, nullptr, nullptr, nullptr, nullptr};
     const std::string path = device::bus::pathOf(appId);
-    application = eldbus_service_interface_register(bus.connection(), path.c_str(), &applicationDescription);
     screen = eldbus_service_interface_register(bus.connection(), path.c_str(), &screenDescription);
-    if (!application || !screen) {
+    if (!screen) {
         throw device::Error("cannot offer " + path + " on the device's bus");
     }
-    eldbus_service_object_data_set(application, stateKey, this);
     eldbus_service_object_data_set(screen, stateKey, this);
 }
 
 Server::State::~State() {
-    if (quitJob) {
-        ecore_job_del(quitJob);
-    }
-    for (Eldbus_Service_Interface* interface : {screen, application}) {
-        if (interface) {
-            eldbus_service_interface_unregister(interface);
-        }
+    if (screen) {
+        eldbus_service_interface_unregister(screen);
     }
 }
 
@@ -148,25 +103,6 @@ Eldbus_Message* Server::State::answerWhenSettled(const Eldbus_Message* request, 
                      eldbus_connection_send(bus.connection(), reply, nullptr, nullptr, -1);
                  }});
     return nullptr;
-}
-
-Eina_Bool Server::State::folder(const Eldbus_Service_Interface* interface, const char*, Eldbus_Message_Iter* value,
-                                const Eldbus_Message*, Eldbus_Message**) {
-    return eldbus_message_iter_basic_append(value, 's', of(interface).bus.folder().root().c_str());
-}
-
-Eldbus_Message* Server::State::onQuit(const Eldbus_Service_Interface* interface, const Eldbus_Message* request) {
-    State& state = of(interface);
-    if (!state.quitJob) {
-        state.quitJob = ecore_job_add(
-            [](void* data) {
-                auto* self = static_cast<State*>(data);
-                self->quitJob = nullptr;
-                guarded(self->quit);
-            },
-            &state);
-    }
-    return eldbus_message_method_return_new(request);
 }
 
 Eldbus_Message* Server::State::onTree(const Eldbus_Service_Interface* interface, const Eldbus_Message* request) {

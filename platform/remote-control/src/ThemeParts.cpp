@@ -20,13 +20,19 @@ struct ObjectDelete {
 };
 using Object = std::unique_ptr<Evas_Object, ObjectDelete>;
 
-struct PartsFree {
-    void operator()(Eina_List* parts) const { edje_edit_string_list_free(parts); }
+struct NamesFree {
+    void operator()(Eina_List* names) const { edje_edit_string_list_free(names); }
 };
+using Names = std::unique_ptr<Eina_List, NamesFree>;
 
 struct Free {
     void operator()(char* text) const { std::free(text); }
 };
+
+unsigned countStates(Evas_Object* reader, const char* part) {
+    const Names states(edje_edit_part_states_list_get(reader, part));
+    return eina_list_count(states.get());
+}
 
 void replaceAll(std::string& text, std::string_view from, std::string_view to) {
     for (std::size_t at = text.find(from); at != std::string::npos; at = text.find(from, at + to.size())) {
@@ -36,40 +42,60 @@ void replaceAll(std::string& text, std::string_view from, std::string_view to) {
 
 }  // namespace
 
-void ThemeParts::nameParts(const Evas_Object* themed, std::vector<Text>& texts) {
+const ThemeParts::Group& ThemeParts::groupOf(const Evas_Object* themed) {
     const char* file = nullptr;
     const char* group = nullptr;
     edje_object_file_get(themed, &file, &group);
-    if (!file || !group) {
-        return;
+    const std::string key = file && group ? std::string(file) + '\n' + group : "";
+    const auto [known, isNew] = groups_.try_emplace(key);
+    if (isNew && !key.empty()) {
+        read(file, group, known->second);
     }
-    for (const std::string& part : textParts(file, group)) {
+    return known->second;
+}
+
+void ThemeParts::nameParts(const Evas_Object* themed, Element& element) {
+    const Group& group = groupOf(themed);
+    for (const std::string& part : group.texts) {
         const Evas_Object* object = edje_object_part_object_get(themed, part.c_str());
-        for (Text& text : texts) {
+        for (Text& text : element.texts) {
             if (text.object == object) {
                 text.part = part;
             }
         }
     }
-}
-
-const std::vector<std::string>& ThemeParts::textParts(const std::string& file, const std::string& group) {
-    const auto [known, isNew] = textParts_.try_emplace(file + '\n' + group);
-    if (!isNew) {
-        return known->second;
-    }
-    const Object reader(edje_edit_object_add(canvas_));
-    if (reader && edje_object_file_set(reader.get(), file.c_str(), group.c_str())) {
-        const std::unique_ptr<Eina_List, PartsFree> parts(edje_edit_parts_list_get(reader.get()));
-        for (const Eina_List* node = parts.get(); node; node = eina_list_next(node)) {
-            const auto* part = static_cast<const char*>(eina_list_data_get(node));
-            const Edje_Part_Type type = edje_edit_part_type_get(reader.get(), part);
-            if (type == EDJE_PART_TYPE_TEXT || type == EDJE_PART_TYPE_TEXTBLOCK) {
-                known->second.emplace_back(part);
+    for (const std::string& part : group.swallows) {
+        const Evas_Object* object = edje_object_part_swallow_get(themed, part.c_str());
+        for (Element& child : element.children) {
+            if (object && child.object == object) {
+                child.part = part;
             }
         }
     }
-    return known->second;
+}
+
+void ThemeParts::read(const std::string& file, const std::string& name, Group& group) const {
+    const Object reader(edje_edit_object_add(canvas_));
+    if (!reader || !edje_object_file_set(reader.get(), file.c_str(), name.c_str())) {
+        return;
+    }
+    const bool ofToolkit = name.starts_with("elm/");
+    const Names parts(edje_edit_parts_list_get(reader.get()));
+    for (const Eina_List* node = parts.get(); node; node = eina_list_next(node)) {
+        const auto* part = static_cast<const char*>(eina_list_data_get(node));
+        const Edje_Part_Type type = edje_edit_part_type_get(reader.get(), part);
+        if (type == EDJE_PART_TYPE_TEXT || type == EDJE_PART_TYPE_TEXTBLOCK) {
+            group.texts.emplace_back(part);
+            continue;
+        }
+        const bool holdsContent = type == EDJE_PART_TYPE_SWALLOW;
+        if (holdsContent) {
+            group.swallows.emplace_back(part);
+        }
+        if (!ofToolkit && countStates(reader.get(), part) > 1) {
+            group.changing.push_back({part, holdsContent});
+        }
+    }
 }
 
 const std::vector<std::string>& ThemeParts::itemTexts(const std::string& group) {

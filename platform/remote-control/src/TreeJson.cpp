@@ -35,6 +35,11 @@ void putContents(Json& json, const Element& element) {
         putPlace(entry, text.place, text.seen);
         json["texts"].push_back(std::move(entry));
     }
+    for (const Part& part : element.parts) {
+        Json entry{{"part", part.name}, {"state", part.state}};
+        putPlace(entry, part.place, part.seen);
+        json["parts"].push_back(std::move(entry));
+    }
     for (const StackItem& item : element.items) {
         json["items"].push_back({{"title", item.title}, {"view", item.view}, {"top", item.top}});
     }
@@ -55,7 +60,12 @@ Json jsonOf(const Element& element) {
     putUnlessEmpty(json, "style", element.style);
     putUnlessEmpty(json, "group", element.group);
     putUnlessEmpty(json, "file", element.file);
+    putUnlessEmpty(json, "part", element.part);
     putPlace(json, element.place, element.seen);
+    if (element.pages.current > 0) {
+        json["page"] = element.pages.current;
+        json["pages"] = element.pages.count;
+    }
     putContents(json, element);
     return json;
 }

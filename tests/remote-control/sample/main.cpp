@@ -65,7 +65,7 @@ int run(const std::string& mode) {
         }
     };
     const remote_control::Server server(
-        *bus, device.application().id, [window] { return window; }, quit);
+        *bus, device.application().id, {[window] { return window; }, quit});
     device::BusName::own(*bus, device.application().id, false);
     device::BusName::own(*bus, device::bus::deviceName, true);
     const auto subscription = device.events().onSetting([&](const std::string& key) {

@@ -21,6 +21,7 @@ void addPackages(CLI::App& app, Session& session);
 void addClear(CLI::App& app, Session& session);
 void addPreferences(CLI::App& app, Session& session);
 void addUsage(CLI::App& app, Session& session);
+void addLaunches(CLI::App& app, Session& session);
 void addLog(CLI::App& app, Session& session);
 void addTree(CLI::App& app, Session& session);
 void addTap(CLI::App& app, Session& session);

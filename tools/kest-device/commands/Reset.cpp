@@ -13,7 +13,8 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr char about[] =
-    R"(Removes the device's database, log and installed packages, and makes a fresh device in the same folder.
+    R"(Removes the device's database, log and installed packages, and what applications wrote to their standard output,
+and makes a fresh device in the same folder.
 Other files in the folder, also a damaged database that was set aside, stay. Refuses while an application runs.
 
 Example:
@@ -63,10 +64,9 @@ void reset(Session& session) {
     PrivateBus(folder).stop();
 
     std::vector<std::string> removed;
-    for (const fs::path& path :
-         {folder.database(), fs::path(folder.database().string() + "-wal"),
-          fs::path(folder.database().string() + "-shm"), folder.log(), fs::path(folder.log().string() + ".1"),
-          fs::path(folder.root() / "application.log"), folder.toolkit()}) {
+    for (const fs::path& path : {folder.database(), fs::path(folder.database().string() + "-wal"),
+                                 fs::path(folder.database().string() + "-shm"), folder.log(),
+                                 fs::path(folder.log().string() + ".1"), folder.outputs(), folder.toolkit()}) {
         removeAll(path, removed);
     }
     removePackages(folder, removed);

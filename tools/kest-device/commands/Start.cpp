@@ -24,7 +24,7 @@ struct Options {
 
 constexpr char examples[] =
     R"(Without APPID the tips application starts. KEY=VALUE words are the extras of its launch request.
-The application's own output goes to application.log in the device's folder.
+The application's own output goes to output/APPID.log in the device's folder.
 
 Where the workstation has no session bus, a private one is started for the device; 'kest-device stop' ends it.
 An application that runs already is left as it is, and that is an error.
@@ -47,7 +47,7 @@ LaunchRequest requestOf(const Options& options) {
         if (equals == 0 || equals == std::string::npos) {
             throw UsageError("extras are written KEY=VALUE; \"" + options.request[i] + "\" is not");
         }
-        request.extras.push_back(options.request[i]);
+        request.extras.emplace_back(options.request[i].substr(0, equals), options.request[i].substr(equals + 1));
     }
     return request;
 }
@@ -92,7 +92,7 @@ void start(Session& session, const Options& options) {
             throw device::Error("the bus of the device does not answer");
         }
         requireOwnBus(session, *session.bus());
-        const Process process = launch(session, package, request);
+        const device::Process process = launch(session, package, request);
         if (options.json) {
             print({{"application", request.appId},
                    {"process", process.id()},

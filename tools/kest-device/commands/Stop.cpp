@@ -15,8 +15,8 @@ using namespace std::chrono_literals;
 constexpr auto patience = 5s;
 
 constexpr char about[] =
-    R"(Asks every running application of the device to end, and ends by force what does not within 5 seconds.
-Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
+    R"(Asks every running application of the device to end, those too that others have launched, and ends by force what does
+not within 5 seconds. Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
 
 Example:
   kest-device stop)";
@@ -46,12 +46,15 @@ void stop(Session& session) {
         return;
     }
     const FolderLock lock(session.folder());
-    const std::vector<RunningApplication> running = runningApplications(session);
-    for (const RunningApplication& application : running) {
-        endApplication(session, application);
-    }
+    std::vector<RunningApplication> running = runningApplications(session);
     if (running.empty()) {
         std::cout << "nothing runs on this device\n";
+    }
+    // Again and again: one that ended may have launched another just before.
+    for (; !running.empty(); running = runningApplications(session)) {
+        for (const RunningApplication& application : running) {
+            endApplication(session, application);
+        }
     }
     PrivateBus(session.folder()).stop();
 }

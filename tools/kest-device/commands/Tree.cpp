@@ -11,8 +11,9 @@ namespace tool {
 namespace {
 
 constexpr char about[] =
-    R"(One line for each widget, list row and text: what it is, its place and size, the theme's group or part that draws
-it. What is out of sight stands in parentheses; lists also tell their rows that are not drawn.
+    R"(One line for each widget, list row and text: what it is, its place and size, the theme's group that draws it or the
+part that it is in, a picture's file, the page that a pager is at, and PART=STATE for parts of the theme that look
+otherwise than at first. What is out of sight stands in parentheses; lists also tell their rows that are not drawn.
 
 Example:
   kest-device tree --json)";

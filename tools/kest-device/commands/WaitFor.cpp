@@ -4,6 +4,7 @@
 #include "LogLine.h"
 #include "device/Error.h"
 
+#include <algorithm>
 #include <chrono>
 #include <sstream>
 #include <thread>
@@ -25,7 +26,7 @@ constexpr char about[] = R"(CONDITION is one of
   log=TEXT       a line of the log holds TEXT, also an earlier one
   usage=VALUE    a usage record has VALUE as one of its values
   ended          no application runs on the device any more
-It is looked at until it is so; after the time-out that is an error.
+It is looked at until it is so; after the time-out that is an error. An application that --app names may yet come up.
 
 Examples:
   kest-device wait-for text="Wi-Fi"
@@ -58,6 +59,14 @@ bool usageHas(Session& session, const std::string& value) {
     return false;
 }
 
+/// An application that is named may be on its way.
+bool answers(Session& session, const std::string& appId) {
+    const std::vector<RunningApplication> running = runningApplications(session);
+    return std::any_of(running.begin(), running.end(), [&](const RunningApplication& application) {
+        return application.id == appId && application.onBus;
+    });
+}
+
 bool holds(Session& session, const Options& options) {
     const std::size_t equals = options.condition.find('=');
     const std::string kind = options.condition.substr(0, equals);
@@ -70,6 +79,9 @@ bool holds(Session& session, const Options& options) {
     }
     if (kind == "usage") {
         return usageHas(session, value);
+    }
+    if (!options.appId.empty() && !answers(session, options.appId)) {
+        return false;
     }
     return callTo(session, theApplication(session, options.appId).id).truth("Has", {options.condition});
 }
@@ -95,7 +107,9 @@ void waitFor(Session& session, const Options& options) {
         if (Clock::now() >= deadline) {
             std::ostringstream seconds;
             seconds << options.seconds;
-            throw device::Error("still not " + options.condition + " after " + seconds.str() + " seconds");
+            const bool away = !options.appId.empty() && !answers(session, options.appId);
+            throw device::Error("still not " + options.condition + " after " + seconds.str() + " seconds" +
+                                (away ? ": " + options.appId + " does not run on this device" : ""));
         }
         std::this_thread::sleep_for(pollInterval);
     }

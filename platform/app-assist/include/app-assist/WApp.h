@@ -22,7 +22,8 @@ public:
     /// Returns the process's exit status: 0; 1 when the device cannot be opened, when there is no display, when the
     /// bus has another device, or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on
     /// standard error.
-    /// An application that is running already on the same device is said too, and gives 0.
+    /// Where another process of the same device is the application, that one gets the launch request, which is said and
+    /// gives 0; 1 when it cannot be handed over.
     int start(int argc, char** argv);
 
     /// Takes the window over and creates it. The window ends the application when it is closed.
@@ -44,7 +45,8 @@ protected:
     /// first launch request, out of sight before onTerminate.
     virtual void onPause();
     virtual void onResume();
-    /// A launch request. `request` is freed by the framework afterwards.
+    /// A launch request, of which the first started the application; after a later one its window is raised.
+    /// `request` is freed by the framework afterwards.
     virtual void onAppControl(app_control_h request, bool firstLaunch);
 
 private:

@@ -2,6 +2,7 @@
 
 #include <chrono>
 #include <string>
+#include <utility>
 #include <variant>
 #include <vector>
 
@@ -16,7 +17,8 @@ class Bus;
 /// an argument (a text that is not UTF-8).
 class BusCall {
 public:
-    using Argument = std::variant<std::string, int, double, bool>;  ///< D-Bus types s, i, d, b
+    using Texts = std::vector<std::pair<std::string, std::string>>;
+    using Argument = std::variant<std::string, int, double, bool, Texts>;  ///< D-Bus types s, i, d, b, a{ss}
     using Arguments = std::vector<Argument>;
 
     /// For example {bus, "com.example.app", bus::pathOf("com.example.app"), bus::screenInterface}.

@@ -2,6 +2,7 @@
 
 #include <SQLiteCpp/SQLiteCpp.h>
 
+#include <chrono>
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -50,10 +51,11 @@ public:
         return Query(prepared);
     }
 
-    /// While it lives, what another process keeps locked fails at once instead of after five seconds.
+    /// While it lives, what another process keeps locked fails at once, or after `patience`, instead of after five
+    /// seconds.
     class Impatience {
     public:
-        explicit Impatience(Database& database);
+        explicit Impatience(Database& database, std::chrono::milliseconds patience = {});
         ~Impatience();
         Impatience(const Impatience&) = delete;
         Impatience& operator=(const Impatience&) = delete;

@@ -4,6 +4,8 @@
 #include "device/Database.h"
 #include "device/Events.h"
 #include "device/Folder.h"
+#include "device/Launcher.h"
+#include "device/Launches.h"
 #include "device/Log.h"
 #include "device/Packages.h"
 #include "device/Preferences.h"
@@ -52,6 +54,8 @@ public:
     Preferences& preferences() { return preferences_; }
     Packages& packages() { return packages_; }
     Usage& usage() { return usage_; }
+    Launches& launches() { return launches_; }
+    Launcher& launcher() { return launcher_; }
     Log& log() { return log_; }
 
     /// The display, by the setting keys::screen as it was when this was first asked for: a window cannot change its
@@ -76,7 +80,9 @@ private:
     Preferences preferences_;
     Packages packages_;
     Usage usage_;
+    Launches launches_;
     Log log_;
+    Launcher launcher_;
     std::unique_ptr<Application> application_;
     mutable const Screen* screen_ = nullptr;
 };

@@ -32,6 +32,9 @@ public:
     std::filesystem::path log() const { return root_ / "device.log"; }
     /// Packages installed on this device only, laid out as under the device's own /opt/usr/apps.
     std::filesystem::path apps() const { return root_ / "opt/usr/apps"; }
+    /// What each application wrote to its standard output and error since it was started last.
+    std::filesystem::path outputs() const { return root_ / "output"; }
+    std::filesystem::path output(const std::string& appId) const { return outputs() / (appId + ".log"); }
     /// What the toolkit writes for itself (configuration, caches, run directory).
     std::filesystem::path toolkit() const { return root_ / "toolkit"; }
     /// The private bus: its socket, the file with its address, and the file with its daemon's process id.

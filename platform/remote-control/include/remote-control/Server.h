@@ -5,6 +5,8 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <utility>
+#include <vector>
 
 namespace device {
 class Bus;
@@ -18,12 +20,19 @@ namespace remote_control {
 /// It asks for no bus name: that is for whoever runs the application.
 class Server {
 public:
+    using Extras = std::vector<std::pair<std::string, std::string>>;
+    using LaunchHandler = std::function<void(const Extras&)>;
+
+    /// What the server asks of the application, from the main loop.
+    struct Application {
+        std::function<Evas_Object*()> window;  ///< its window at that time, null when there is none
+        std::function<void()> quit;            ///< after the caller of Quit() was answered
+        LaunchHandler launch = {};  ///< after the caller of Launch() was answered; none: it takes no such requests
+    };
+
     /// Exports the object on `bus`, which must outlive the server.
-    /// `window` gives the application's window at the time of a request, null when there is none.
-    /// `quit` is called from the main loop, after the caller of Quit() was answered.
     /// Throws device::Error when the bus does not take the object.
-    Server(device::Bus& bus, const std::string& appId, std::function<Evas_Object*()> window,
-           std::function<void()> quit);
+    Server(device::Bus& bus, const std::string& appId, Application application);
     /// Withdraws the object. Requests under way are answered with an error.
     ~Server();
     Server(const Server&) = delete;

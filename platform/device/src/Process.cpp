@@ -1,5 +1,6 @@
-#include "Process.h"
+#include "device/Process.h"
 
+#include "Files.h"
 #include "device/Error.h"
 
 #include <algorithm>
@@ -14,8 +15,7 @@
 #include <thread>
 #include <unistd.h>
 
-namespace tool {
-
+namespace device {
 namespace {
 
 namespace fs = std::filesystem;
@@ -34,22 +34,19 @@ std::vector<std::string> environmentWith(const std::vector<std::pair<std::string
         const std::string name = text.substr(0, text.find('='));
         const bool changed =
             std::any_of(changes.begin(), changes.end(), [&](const auto& change) { return change.first == name; });
-        if (!changed) {
+        if (!changed)
             all.push_back(text);
-        }
     }
-    for (const auto& [name, value] : changes) {
+    for (const auto& [name, value] : changes)
         all.push_back(std::string(name).append("=").append(value));
-    }
     return all;
 }
 
 std::vector<char*> pointersTo(std::vector<std::string>& texts) {
     std::vector<char*> pointers;
     pointers.reserve(texts.size() + 1);
-    for (std::string& text : texts) {
+    for (std::string& text : texts)
         pointers.push_back(text.data());
-    }
     pointers.push_back(nullptr);
     return pointers;
 }
@@ -67,6 +64,16 @@ public:
     }
     SpawnSettings(const SpawnSettings&) = delete;
     SpawnSettings& operator=(const SpawnSettings&) = delete;
+
+    /// A session of its own, and no signal blocked or ignored: EFL ignores some.
+    void standAlone() {
+        sigset_t signals;
+        sigfillset(&signals);
+        posix_spawnattr_setsigdefault(&attributes, &signals);
+        sigemptyset(&signals);
+        posix_spawnattr_setsigmask(&attributes, &signals);
+        posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSID | POSIX_SPAWN_SETSIGDEF | POSIX_SPAWN_SETSIGMASK);
+    }
 
     posix_spawn_file_actions_t actions{};
     posix_spawnattr_t attributes{};
@@ -86,71 +93,71 @@ std::vector<std::string> Process::arguments() const {
     std::ifstream stream(procFolder(id_) / "cmdline", std::ios::binary);
     std::vector<std::string> words;
     // The kernel ends each with a zero byte.
-    for (std::string word; std::getline(stream, word, '\0');) {
+    for (std::string word; std::getline(stream, word, '\0');)
         words.push_back(word);
-    }
     return words;
 }
 
 bool Process::endsWithin(std::chrono::milliseconds time) const {
     const auto deadline = std::chrono::steady_clock::now() + time;
     while (runs()) {
-        if (std::chrono::steady_clock::now() >= deadline) {
+        if (std::chrono::steady_clock::now() >= deadline)
             return false;
-        }
         std::this_thread::sleep_for(5ms);
     }
     return true;
 }
 
 void Process::end() const {
-    if (id_ <= 0) {
-        throw device::Error(
-            "a process that cannot be seen from here, for example in a container, has to be ended there");
-    }
+    if (id_ <= 0)
+        throw Error("a process that cannot be seen from here, for example in a container, has to be ended there");
     kill(id_, SIGTERM);
-    if (endsWithin(patience)) {
+    if (endsWithin(patience))
         return;
-    }
     kill(id_, SIGKILL);
-    if (!endsWithin(patience)) {
-        throw device::Error("process " + std::to_string(id_) + " does not end; end it by hand");
-    }
+    if (!endsWithin(patience))
+        throw Error("process " + std::to_string(id_) + " does not end; end it by hand");
 }
 
 Process startDetached(const Program& program) {
     SpawnSettings settings;
-    posix_spawnattr_setflags(&settings.attributes, POSIX_SPAWN_SETSID);
-    posix_spawn_file_actions_addopen(&settings.actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
-    posix_spawn_file_actions_addopen(&settings.actions, STDOUT_FILENO, program.output.c_str(),
-                                     O_WRONLY | O_CREAT | O_TRUNC, 0600);
-    posix_spawn_file_actions_adddup2(&settings.actions, STDOUT_FILENO, STDERR_FILENO);
-    if (program.inherited >= 0) {
-        // Onto itself: that takes its close-on-exec mark away, in the child only.
-        posix_spawn_file_actions_adddup2(&settings.actions, program.inherited, program.inherited);
-    }
-    posix_spawn_file_actions_addchdir_np(&settings.actions, "/");
+    settings.standAlone();
+    posix_spawn_file_actions_t* actions = &settings.actions;
+    posix_spawn_file_actions_addopen(actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
+    if (program.output)
+        posix_spawn_file_actions_adddup2(actions, program.output.get(), STDOUT_FILENO);
+    else
+        posix_spawn_file_actions_addopen(actions, STDOUT_FILENO, "/dev/null", O_WRONLY, 0);
+    posix_spawn_file_actions_adddup2(actions, STDOUT_FILENO, STDERR_FILENO);
+    int firstClosed = STDERR_FILENO + 1;
+    if (program.inherited >= 0)
+        posix_spawn_file_actions_adddup2(actions, program.inherited, firstClosed++);
+    posix_spawn_file_actions_addclosefrom_np(actions, firstClosed);
+    posix_spawn_file_actions_addchdir_np(actions, "/");
 
     std::vector<std::string> words = program.words;
     std::vector<std::string> environment = environmentWith(program.environment);
     pid_t id = 0;
-    const int error = posix_spawn(&id, words.front().c_str(), &settings.actions, &settings.attributes,
-                                  pointersTo(words).data(), pointersTo(environment).data());
-    if (error != 0) {
-        throw device::Error("cannot start " + words.front() + ": " + std::strerror(error));
-    }
+    const int error = posix_spawn(&id, words.front().c_str(), actions, &settings.attributes, pointersTo(words).data(),
+                                  pointersTo(environment).data());
+    if (error != 0)
+        throw Error("cannot start " + words.front() + ": " + reasonOf(error));
     return Process(id);
 }
 
 std::optional<std::string> endOfChild(const Process& child) {
     int status = 0;
-    if (waitpid(child.id(), &status, WNOHANG) != child.id()) {
+    if (waitpid(child.id(), &status, WNOHANG) != child.id())
         return std::nullopt;
-    }
-    if (WIFSIGNALED(status)) {
-        return "by signal " + std::to_string(WTERMSIG(status)) + " (" + strsignal(WTERMSIG(status)) + ")";
-    }
-    return "with status " + std::to_string(WEXITSTATUS(status));
+    return WIFSIGNALED(status) ? endBySignal(WTERMSIG(status)) : endWithStatus(WEXITSTATUS(status));
 }
 
-}  // namespace tool
+std::string endWithStatus(int status) {
+    return "with status " + std::to_string(status);
+}
+
+std::string endBySignal(int signal) {
+    return "by signal " + std::to_string(signal) + " (" + strsignal(signal) + ")";
+}
+
+}  // namespace device

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "device/Descriptor.h"
+
 #include <chrono>
 #include <filesystem>
 #include <optional>
@@ -7,7 +9,7 @@
 #include <utility>
 #include <vector>
 
-namespace tool {
+namespace device {
 
 /// A process of this machine, by its id.
 class Process {
@@ -22,7 +24,7 @@ public:
 
     /// Whether it ended within that time.
     bool endsWithin(std::chrono::milliseconds time) const;
-    /// Asks it to end, and after a while makes it end. Throws device::Error when it goes on nevertheless.
+    /// Asks it to end, and after a while makes it end. Throws Error when it goes on nevertheless.
     void end() const;
 
 private:
@@ -32,16 +34,21 @@ private:
 /// What to start, and how it stands towards its surroundings. Nothing of it passes through a shell.
 struct Program {
     std::vector<std::string> words;  ///< absolute path of the executable, then its arguments
-    std::filesystem::path output;    ///< file that takes its standard output and error; /dev/null to drop them
+    Descriptor output;               ///< takes its standard output and error; none: they are dropped
     std::vector<std::pair<std::string, std::string>> environment;  ///< set beside what this process has
-    int inherited = -1;  ///< a file that it gets under the same number; -1 for none
+    int inherited = -1;  ///< a file of this process that it gets as descriptor 3; -1 for none
 };
 
-/// Starts a program in a session of its own, in the folder "/", with no standard input.
-/// Throws device::Error that names the program when it cannot be started.
+/// Starts a program in a session of its own, in the folder "/", with no standard input, with no other open file than
+/// the ones above, and with every signal as a fresh process has it. Waits no longer than until the program is loaded.
+/// Throws Error that names the program when it cannot be started.
 Process startDetached(const Program& program);
 
-/// How a child of this process ended ("with status 1", "by signal 11 (Segmentation fault)"), or nullopt while it runs.
+/// How a child of this process ended (as the two below say it), or nullopt while it runs.
 std::optional<std::string> endOfChild(const Process& child);
+/// "with status 1"
+std::string endWithStatus(int status);
+/// "by signal 11 (Segmentation fault)"
+std::string endBySignal(int signal);
 
-}  // namespace tool
+}  // namespace device

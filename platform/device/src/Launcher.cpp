@@ -1,0 +1,177 @@
+#include "device/Launcher.h"
+
+#include "Utf8.h"
+#include "device/ApplicationLock.h"
+#include "device/ApplicationStart.h"
+#include "device/Device.h"
+#include "device/Error.h"
+#include "device/MainLoop.h"
+
+#include <Ecore.h>
+
+#include <algorithm>
+#include <optional>
+#include <utility>
+
+namespace device {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr auto databasePatience = 250ms;
+/// An application that fails later than that was started all right.
+constexpr auto startTime = 10s;
+constexpr std::size_t mostBytes = 64 * 1024;
+/// What an extra costs beside its text, where it is passed on.
+constexpr std::size_t bytesOfExtra = 8;
+/// No id of an application is longer.
+constexpr std::size_t longestId = 255;
+
+std::size_t sizeOf(const LaunchRequest& request) {
+    std::size_t size = request.appId.size();
+    for (const auto& [key, value] : request.extras)
+        size += key.size() + value.size() + bytesOfExtra;
+    return size;
+}
+
+/// Why the request cannot be passed on as KEY=VALUE words and over a bus; "" when it can.
+std::string faultOf(const LaunchRequest& request) {
+    if (sizeOf(request) > mostBytes)
+        return "the request is larger than 64 KiB";
+    for (const auto& [key, value] : request.extras) {
+        if (!isUtf8(key) || !isUtf8(value))
+            return "the extra \"" + key + "\" is not UTF-8";
+        if (key.find('=') != std::string::npos)
+            return "the extra \"" + key + "\" has a \"=\" in its name";
+    }
+    return "";
+}
+
+/// As much of it as a record holds.
+LaunchRequest shortened(LaunchRequest request) {
+    if (sizeOf(request) > mostBytes) {
+        request.extras.clear();
+        request.appId = request.appId.substr(0, longestId);
+    }
+    return request;
+}
+
+}  // namespace
+
+Launcher::~Launcher() {
+    if (endHandler_)
+        ecore_event_handler_del(static_cast<Ecore_Event_Handler*>(endHandler_));
+}
+
+Launcher::Result Launcher::launch(const LaunchRequest& request) {
+    const Database::Impatience impatience(device_.database(), databasePatience);
+    reapChildren();
+    if (const std::string fault = faultOf(request); !fault.empty())
+        return refuse(shortened(request), Result::Rejected, fault);
+    try {
+        return carryOut(request);
+    } catch (const Error& failure) {
+        return refuse(request, Result::Failed, failure.what());
+    }
+}
+
+Launcher::Result Launcher::carryOut(const LaunchRequest& request) {
+    const std::optional<Package> package = device_.packages().find(request.appId);
+    if (!package)
+        return refuse(request, Result::NotFound, "it is not installed");
+    if (package->exec.empty())
+        return refuse(request, Result::NotFound, "it has no program: its manifest names none");
+    requireProgram(*package);
+    watchChildren();
+    ApplicationStart start;
+    start.extras = request.extras;
+    start.again = runs(request);
+    // Failures that were planned for this process are not meant for that one.
+    start.environment = {{"DEVICE_FAULTS", ""}};
+    const Process process = startApplication(device_.folder(), *package, start);
+    const long long id = record(request, start.again ? LaunchOutcome::Asked : LaunchOutcome::Started, "");
+    children_.push_back({process, id, request, start.again, std::chrono::steady_clock::now()});
+    return Result::Accepted;
+}
+
+Launcher::Result Launcher::refuse(const LaunchRequest& request, Result result, const std::string& reason) {
+    record(request, LaunchOutcome::Failed, reason);
+    device_.log().write(Log::Level::Warning, "DEVICE",
+                        request.caller + " cannot launch \"" + request.appId + "\": " + reason);
+    return result;
+}
+
+bool Launcher::runs(const LaunchRequest& request) const {
+    // Whoever asks for itself runs; to look at its own lock would give that up.
+    return request.appId == request.caller || ApplicationLock::holder(device_.folder(), request.appId).has_value() ||
+           std::any_of(children_.begin(), children_.end(), [&](const Child& child) {
+               return !child.again && child.request.appId == request.appId && child.process.runs();
+           });
+}
+
+long long Launcher::record(const LaunchRequest& request, LaunchOutcome outcome, const std::string& reason) {
+    try {
+        return device_.launches().append(request, outcome, reason);
+    } catch (const Error& failure) {
+        device_.log().write(Log::Level::Error, "DEVICE", failure.what());
+        return 0;
+    }
+}
+
+void Launcher::update(const Child& child, LaunchOutcome outcome, const std::string& reason) {
+    if (outcome == LaunchOutcome::Failed)
+        device_.log().write(Log::Level::Warning, "DEVICE",
+                            child.request.caller + " cannot launch \"" + child.request.appId + "\": " + reason);
+    try {
+        const Database::Impatience impatience(device_.database(), databasePatience);
+        device_.launches().update(child.record, outcome, reason);
+    } catch (const Error& failure) {
+        device_.log().write(Log::Level::Error, "DEVICE", failure.what());
+    }
+}
+
+/// EFL's main loop waits for every child of the process, and says how it ended.
+void Launcher::watchChildren() {
+    if (endHandler_)
+        return;
+    startMainLoop();
+    endHandler_ = ecore_event_handler_add(
+        ECORE_EXE_EVENT_DEL,
+        [](void* launcher, int, void* event) -> Eina_Bool {
+            const auto* end = static_cast<Ecore_Exe_Event_Del*>(event);
+            static_cast<Launcher*>(launcher)->childEnded(
+                end->pid, end->signalled ? endBySignal(end->exit_signal) : endWithStatus(end->exit_code),
+                end->exited && end->exit_code == 0);
+            return ECORE_CALLBACK_PASS_ON;
+        },
+        this);
+}
+
+/// For a process whose main loop does not run.
+void Launcher::reapChildren() {
+    const std::vector<Child> children = children_;
+    for (const Child& child : children)
+        if (const std::optional<std::string> how = endOfChild(child.process))
+            childEnded(child.process.id(), *how, *how == endWithStatus(0));
+}
+
+void Launcher::childEnded(int process, const std::string& how, bool well) {
+    const auto found = std::find_if(children_.begin(), children_.end(),
+                                    [&](const Child& child) { return child.process.id() == process; });
+    if (found == children_.end())
+        return;
+    const Child child = *found;
+    children_.erase(found);
+    if (well) {
+        // Also where two processes began at the same time, and the other one was the first.
+        if (child.again || runs(child.request))
+            update(child, LaunchOutcome::HandedOver, "");
+        return;
+    }
+    if (!child.again && std::chrono::steady_clock::now() - child.begin > startTime)
+        return;
+    const std::string words = lastWordsOf(device_.folder(), child.request.appId);
+    update(child, LaunchOutcome::Failed, "it ended " + how + (words.empty() ? "" : "; its last words: " + words));
+}
+
+}  // namespace device
