@@ -2,12 +2,26 @@
 
 #include <app-assist/WPageSlideView.h>
 
-/// The screen that opens over the main list. So far an empty page with its back button.
+#include <cstdint>
+
+namespace app_assist {
+class KestContentSubView;
+}
+
+/// The screen that opens over the main list: a pager with one page per tip menu, in the order of the catalogue. All
+/// pages are there from the start; the chosen one is filled first, the others a moment later.
 class KestContentView : public app_assist::WPageSlideView {
 public:
     /// `listIndex` is the genlist index of the chosen row: 2 for the first menu.
     /// `pushOnTop` false makes the view the top item without a transition.
     KestContentView(int listIndex, bool pushOnTop);
+    ~KestContentView() override;
+
+    /// Shows menu `index` (from 0) at once. Called for a launch request while the pager is open.
+    void showContentsPage(int index);
+
+    /// A catalogue has no more menus than this.
+    static const std::int32_t mostPages = 15;
 
 protected:
     Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override;
@@ -17,8 +31,21 @@ protected:
     void onPushed(Elm_Object_Item* naviItem) override;
 
 private:
-    static void __backCb(void* data, Evas_Object* obj, void* event_info);
+    void __initScroller();
+    /// Null for an index without a page, and when the pages are about to go.
+    app_assist::KestContentSubView* __pageAt(std::int32_t index) const;
+    void __preparePages();
 
-    int __selectedView;
+    static void __backCb(void* data, Evas_Object* obj, void* event_info);
+    static void __pageScrollStartCb(void* data, Evas_Object* obj, void* event_info);
+    static void __pageScrollStopCb(void* data, Evas_Object* obj, void* event_info);
+
+    /// The page that was opened, or that a launch request chose last; a swipe leaves it alone.
+    std::int32_t __selectedView;
+    /// The base deletes the pages, once they are appended.
+    app_assist::KestContentSubView* pages[mostPages];
+    std::int32_t pageCount;
     bool pushOnTop;
+    /// How many of the pages the base has taken over.
+    std::int32_t appended;
 };

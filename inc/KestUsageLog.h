@@ -7,4 +7,6 @@ class KestUsageLog {
 public:
     /// A menu was chosen in the main list ("KT01").
     static void menuChosen(const std::string& menuTitle);
+    /// A demonstration's reply button was pressed ("KT02").
+    static void replyPressed();
 };

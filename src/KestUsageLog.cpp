@@ -31,3 +31,7 @@ void insertRecord(const char* feature, const std::string* extra) {
 void KestUsageLog::menuChosen(const std::string& menuTitle) {
     insertRecord("KT01", &menuTitle);
 }
+
+void KestUsageLog::replyPressed() {
+    insertRecord("KT02", nullptr);
+}

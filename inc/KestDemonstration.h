@@ -1,0 +1,63 @@
+#pragma once
+
+#include "KestPictureArea.h"
+
+#include <app-assist/WUiTimer.h>
+
+/// Plays a page's pictures by itself: a sequence pages on, with a marker that shows where to touch, a tall picture
+/// scrolls down and back. Begins when the theme says that its reply button was released; a page that is displayed sends
+/// that signal itself.
+///
+/// | state         | after             | what happens then                                                     |
+/// |---------------|-------------------|-----------------------------------------------------------------------|
+/// | Idle          | the release       | Waiting where the first picture has a marker, else Advancing          |
+/// | Waiting       | secondsToTouch    | the marker of the picture in view shows: Touching                     |
+/// | Touching      | secondsToAdvance  | the next picture comes: Waiting or Advancing as it has a marker;      |
+/// | Advancing     | secondsToAdvance  | after the last one the first one comes back: Idle                     |
+/// | Advancing     | secondsToScroll   | a tall picture scrolls down: ScrollingBack                            |
+/// | ScrollingBack | secondsToScroll   | it scrolls back: Idle                                                 |
+///
+/// The reply button is hidden in every state but Idle. At most one timer is pending, and none outlives the page.
+class KestDemonstration {
+public:
+    enum class State { Idle, Waiting, Touching, Advancing, ScrollingBack };
+
+    /// Both outlive it. The timers end with the view and with the area's layout.
+    KestDemonstration(KestPictureArea& pictureArea, app_assist::WView& pageView);
+    ~KestDemonstration();
+    KestDemonstration(const KestDemonstration&) = delete;
+    KestDemonstration& operator=(const KestDemonstration&) = delete;
+
+    /// Listen to the reply button of a sequence, or of a tall picture.
+    void createButtonHorizontal(Evas_Object* imageLayout);
+    void createButtonVertical(Evas_Object* imageLayout);
+
+    /// Ends it where it is; the pictures stay as they are.
+    void stop();
+    /// Ends it and starts over from the first picture.
+    void restart();
+    /// Ends it because the page is swiped: back to the first picture.
+    void reset();
+
+private:
+    using Step = bool (KestDemonstration::*)();
+
+    void __start(State next, double seconds, Step step);
+    void __end();
+    void __release();
+    void __press();
+    bool __touchStep();
+    bool __advanceStep();
+    bool __scrollStep();
+
+    static void __pressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+    static void __releasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+
+    KestPictureArea& area;
+    app_assist::WView& view;
+    State state;
+    /// The one pending timer.
+    app_assist::WUiTimer::Handle timer;
+    /// 1 while a run has the reply button hidden.
+    int replyHidden;
+};
