@@ -176,6 +176,16 @@ TEST_F(EflText, ALinkIsTappedAfterALongPressToo) {
     EXPECT_EQ(nullptr, test_ui::widget(window(), "Elm_Hover"));
 }
 
+TEST_F(EflText, ShowsNoPointerWhereTheFingerIs) {
+    entry("One");
+    const auto before = screen().picture();
+    screen().press({400, 75});
+    screen().moveTo({402, 75});
+    test_ui::runFor(0.3);
+    EXPECT_EQ(before, screen().picture());
+    screen().lift();
+}
+
 TEST_F(EflText, OfAnEntryReadsBackAsItWasWritten) {
     const std::string written = "<font_style='Regular' font_size=36 align=left linegap=10>One <a href=app>two</a></>";
     Evas_Object* object = entry(written);

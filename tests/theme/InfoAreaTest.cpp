@@ -96,6 +96,20 @@ TEST_F(InfoArea, ShowsAThumbForAMomentWhenItsPageIsDisplayed) {
     EXPECT_EQ(1, screen().picture().colours(edge));
 }
 
+TEST_F(InfoArea, HasAFaintLineAboveItWhereThereIsMoreAboveInTheDarkThemeToo) {
+    std::string text;
+    for (int line = 0; line < 30; ++line)
+        text += "Line " + std::to_string(line) + "<br/>";
+    show("Find", text, {.isDark = true});
+    const auto edge = [&] { return screen().picture().pixel(60, 781); };
+    EXPECT_EQ(paper, edge());
+    screen().swipe({360, 1200}, {360, 900}, 0.3);
+    test_ui::runFor(3);
+    EXPECT_NE(paper, edge());
+    EXPECT_GT(edge() & 255, 0xC0u);
+    EXPECT_EQ(paper, screen().picture().pixel(20, 781)) << "it begins at the margin";
+}
+
 class InfoAreaInBothThemes : public InfoArea, public testing::WithParamInterface<bool> {};
 
 TEST_P(InfoAreaInBothThemes, IsLightPaperWithDarkWriting) {

@@ -3,7 +3,6 @@
 namespace {
 
 using test_ui::Point;
-using test_ui::Rect;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
