@@ -164,6 +164,21 @@ TEST_F(Application, RunsAtTheRootWithItsToolkitsFilesInTheDevice) {
     EXPECT_EQ(std::filesystem::perms::owner_all, std::filesystem::status(toolkit / "run").permissions());
 }
 
+TEST_F(Application, DrawsAPictureInATextThatIsNamedWithTheSlashOfItsPathLeftOut) {
+    RunningApp running(app_);
+    const unsigned int red = 0xffff0000;
+    const auto file = device_.folder() / "icon.png";
+    ASSERT_TRUE(test_ui::Picture(1, 1, &red).save(file));
+    Evas_Object* entry = elm_entry_add(test_ui::UiTest::window());
+    const std::string text = "<item size=62x62 vsize=full href=file:/" + file.string() + "></item>";
+    elm_object_text_set(entry, text.c_str());
+    evas_object_resize(entry, 720, 200);
+    evas_object_show(entry);
+    test_ui::runFor(0.5);
+    const int side = static_cast<int>(62 * elm_config_scale_get());
+    EXPECT_EQ(side * side, test_ui::UiTest::screen().picture().count(0xff0000, {0, 0, 720, 200}));
+}
+
 TEST_F(Application, KeepsARunDirectoryThatIsGood) {
     const auto good = device_.folder() / "run";
     std::filesystem::create_directory(good);

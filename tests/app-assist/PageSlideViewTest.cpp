@@ -16,15 +16,30 @@ TEST_F(PageSlideView, EachPageIsCreatedAndToldWhatItBecame) {
                                     "1: onCreate", "1: onCreated", "1: onSetAsPageContent", "1: onPushed"));
 }
 
-TEST_F(PageSlideView, PagesAreAsLargeAsTheViewAndStandBesideEachOther) {
-    Pager* pager = open(0, 3);
+TEST_F(PageSlideView, PagesAreAsLargeAsTheViewAndThoseOutOfSightStandBesideIt) {
+    Pager* pager = open(2, 5);
     test_ui::runFor(0.5);
     const Rect view = test_ui::geometry(pager->getScroller());
     EXPECT_EQ(720, view.width);
-    for (int i = 0; i < 3; ++i) {
-        const Rect expected{view.x + i * view.width, view.y, view.width, view.height};
+    for (int i = 0; i < 5; ++i) {
+        const int x = i < 2 ? -720 : i > 2 ? 720 : 0;
+        const Rect expected{view.x + x, view.y, view.width, view.height};
         EXPECT_EQ(expected, test_ui::geometry(pages_[static_cast<size_t>(i)]->getEvasObj())) << "page " << i;
     }
+}
+
+TEST_F(PageSlideView, APageThatComesIntoSightTouchesTheOneThatGoes) {
+    open(1, 5);
+    test_ui::runFor(0.5);
+    screen().press({600, 700});
+    for (int x = 600; x > 100; x -= 20) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 700});
+    }
+    const Rect goes = test_ui::geometry(pages_[1]->getEvasObj());
+    EXPECT_LT(goes.x, -300);
+    EXPECT_EQ(goes.x + goes.width, test_ui::geometry(pages_[2]->getEvasObj()).x);
+    screen().lift();
 }
 
 class FirstPage : public PageSlideView, public testing::WithParamInterface<std::tuple<int, bool>> {

@@ -11,19 +11,21 @@
 #include <utility>
 #include <vector>
 
-/// A page that is filled with one colour, or with a text, or with a text in a scroller of its own.
+/// A page that is a button, or empty, or filled with a text, or with a text in a scroller of its own.
 class Page : public TellingView {
 public:
     using TellingView::TellingView;
-    enum class Filling { Nothing, Text, ScrolledText } filling = Filling::Nothing;
+    enum class Filling { Button, Nothing, Text, ScrolledText } filling = Filling::Button;
     Evas_Object* entry = nullptr;
     Evas_Object* inner = nullptr;
     int clicks = 0;
 
 protected:
     Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override {
-        if (filling == Filling::Nothing)
+        if (filling == Filling::Button)
             return TellingView::onCreate(parent, viewParam);
+        if (filling == Filling::Nothing)
+            return elm_layout_add(parent);
         if (filling == Filling::Text)
             return makeEntry(parent);
         inner = elm_scroller_add(parent);
@@ -97,7 +99,7 @@ protected:
         evas_object_show(naviframe_.getEvasObj());
     }
 
-    Page* make(const std::string& name, Page::Filling filling = Page::Filling::Nothing) {
+    Page* make(const std::string& name, Page::Filling filling = Page::Filling::Button) {
         auto* page = new Page(name, story_);
         page->filling = filling;
         pages_.push_back(page);

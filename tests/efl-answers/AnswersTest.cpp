@@ -214,4 +214,39 @@ TEST_F(EflLanguage, WithoutANameTranslatesAnewInTheLanguageThatIs) {
     EXPECT_EQ(2, changes_);
 }
 
+class EflTitle : public EflLanguage {
+protected:
+    EflTitle() {
+        naviframe_ = elm_naviframe_add(window());
+        item_ = elm_naviframe_item_push(naviframe_, nullptr, nullptr, nullptr, elm_layout_add(naviframe_), nullptr);
+    }
+    void setTitle(const char* text) {
+        elm_object_item_domain_translatable_part_text_set(item_, "elm.text.title", "drinks", text);
+    }
+    std::string title() const { return test_ui::itemText(item_, "elm.text.title"); }
+
+    Evas_Object* naviframe_;
+    Elm_Object_Item* item_;
+};
+
+TEST_F(EflTitle, ThatIsNoIdIsShownAsItIs) {
+    for (const char* text : {"2/11", "3/11", "3/11", "%d of %s", "11/11"}) {
+        setTitle(text);
+        EXPECT_EQ(text, title());
+    }
+}
+
+TEST_F(EflTitle, ThatIsNoIdStaysInALanguageChangeAndOneThatIsFollowsIt) {
+    setTitle("2/11");
+    elm_language_set("ru_RU");
+    EXPECT_EQ("2/11", title());
+    setTitle("IDS_TEA");
+    EXPECT_EQ("Чай", title());
+    elm_language_set("ko_KR");
+    EXPECT_EQ("차", title());
+    setTitle("1/11");
+    elm_language_set("ru_RU");
+    EXPECT_EQ("1/11", title());
+}
+
 }  // namespace

@@ -42,6 +42,8 @@ Toolkit::Toolkit(const device::Device& device, Messages messages, int argc, char
         eina_log_print_cb_set(writeToLog, nullptr);
     elm_init(argc, argv);
     elm_config_scale_set(device.screen().scale);
+    // A device has no mouse pointer. EFL makes a picture of one for every text, and leaves a part of it behind.
+    elm_config_cursor_engine_only_set(EINA_TRUE);
 }
 
 Toolkit::~Toolkit() {

@@ -55,11 +55,13 @@ void WPageSlideView::onInitScroller(Evas_Object* scroller) {
 }
 
 // By hand: widgets overwrite a size that they were told to have at least, so no box would make them a page wide.
-// Where reading begins at the right the first page lies there, as the scroller counts its pages.
+// Where reading begins at the right the first page lies there, as the scroller counts its pages. Only pages that are
+// seen move along: all others wait beside the view, because moving everything in them would take most of a frame.
 void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* data) {
     const auto* view = static_cast<WPageSlideView*>(data);
-    int x = 0, y = 0, width = 0, height = 0;
-    evas_object_geometry_get(box, &x, &y, nullptr, nullptr);
+    int rowX = 0, y = 0, viewX = 0, viewWidth = 0, width = 0, height = 0;
+    evas_object_geometry_get(box, &rowX, &y, nullptr, nullptr);
+    evas_object_geometry_get(view->scroller_, &viewX, nullptr, &viewWidth, nullptr);
     elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, &height);
     const int count = static_cast<int>(eina_list_count(children->children));
     const bool mirrored = elm_object_mirrored_get(view->scroller_);
@@ -68,7 +70,8 @@ void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* childre
     void* each = nullptr;
     EINA_LIST_FOREACH(children->children, node, each) {
         Evas_Object* page = static_cast<Evas_Object_Box_Option*>(each)->obj;
-        evas_object_move(page, x + width * (mirrored ? count - 1 - index : index), y);
+        const int x = rowX + width * (mirrored ? count - 1 - index : index);
+        evas_object_move(page, std::clamp(x, viewX - width, viewX + viewWidth), y);
         evas_object_resize(page, width, height);
         ++index;
     }

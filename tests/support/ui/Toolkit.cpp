@@ -40,6 +40,7 @@ Toolkit::Toolkit() {
     ecore_app_no_system_modules();
     efreet_cache_disable();
     elm_init(0, nullptr);
+    elm_config_cursor_engine_only_set(EINA_TRUE);
     log_.emplace();
     clock::driveMainLoop();
 }
