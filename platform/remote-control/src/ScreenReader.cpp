@@ -47,8 +47,8 @@ Pages pagesOf(const Evas_Object* scroller) {
 }
 
 bool holdsSomething(const Element& element) {
-    return !element.name.empty() || !element.file.empty() || !element.texts.empty() || !element.children.empty() || !element.rows.empty() ||
-           !element.items.empty();
+    return !element.name.empty() || !element.file.empty() || !element.texts.empty() || !element.children.empty() ||
+           !element.rows.empty() || !element.items.empty();
 }
 
 /// Not so for the empty helpers that windows keep at hand, nor for the window itself, whose contents lie beside it.

@@ -64,8 +64,7 @@ int run(const std::string& mode) {
             elm_exit();
         }
     };
-    const remote_control::Server server(
-        *bus, device.application().id, {[window] { return window; }, quit});
+    const remote_control::Server server(*bus, device.application().id, {[window] { return window; }, quit});
     device::BusName::own(*bus, device.application().id, false);
     device::BusName::own(*bus, device::bus::deviceName, true);
     const auto subscription = device.events().onSetting([&](const std::string& key) {
