@@ -25,6 +25,7 @@ std::vector<std::string> otherCalls;
 std::map<std::string, int> failing;
 std::map<std::string, Evas_Smart_Cb> smartCallbacks;
 uxt_theme_changed_cb lastThemeCallback = nullptr;
+int screenWidth = 0;
 
 template <class... Arguments>
 void note(const Arguments&... arguments) {
@@ -122,6 +123,10 @@ void calls::fail(const std::string& name, int time) {
     failing[name] = time;
 }
 
+void calls::setScreenWidth(int width) {
+    screenWidth = width;
+}
+
 Evas_Smart_Cb calls::smartCallback(const std::string& event) {
     return smartCallbacks.at(event);
 }
@@ -162,6 +167,12 @@ CALL(void, elm_scroller_region_bring_in, Evas_Object* scroller, int x, int y, in
 CALL(void, elm_scroller_region_show, Evas_Object* scroller, int x, int y, int width, int height) {
     tellMovement(scroller, "at y " + std::to_string(y));
     __real_elm_scroller_region_show(scroller, x, y, width, height);
+}
+
+CALL(void, elm_win_screen_size_get, const Evas_Object* window, int* x, int* y, int* width, int* height) {
+    __real_elm_win_screen_size_get(window, x, y, width, height);
+    if (width && screenWidth > 0)
+        *width = screenWidth;
 }
 
 CALL(int, ravella_log_manager_insert, ravella_log_manager_h manager, const char* uri, bundle* record,

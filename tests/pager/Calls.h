@@ -25,6 +25,9 @@ std::vector<std::string> steps(const std::vector<std::string>& words);
 /// Has the call of that name give nothing, the how-manieth time from now.
 void fail(const std::string& name, int time = 1);
 
+/// Has the display be that wide for who asks; 0: as wide as it is.
+void setScreenWidth(int width);
+
 /// The callback that was registered last for that smart event.
 Evas_Smart_Cb smartCallback(const std::string& event);
 /// The callback that was registered last for changes of the theme.

@@ -24,7 +24,7 @@ protected:
     };
 
     /// Draws a picture of one colour (0xRRGGBB) where a tip finds it by that name, and returns its path.
-    std::string drawPicture(const std::string& name, int width = 72, int height = 66,
+    std::string drawPicture(const std::string& name, int width = 716, int height = 655,
                             unsigned int colour = 0x336699) const;
     /// Draws "a_01.png" and those that follow, with a touch marker over each picture of `marked` (from 0).
     void drawSequence(int count, const std::set<int>& marked = {}) const;
