@@ -70,13 +70,11 @@ protected:
         return process;
     }
 
-    /// Ends the programs that a test has let hang.
-    void endProgram() const {
-        for (const auto& entry : std::filesystem::directory_iterator("/proc")) {
-            const std::string environment = support::readFile(entry.path() / "environ");
-            if (environment.find("KEST_DEVICE=" + device_.root().string() + '\0') != std::string::npos)
-                kill(std::stoi(entry.path().filename()), SIGKILL);
-        }
+    /// A program that goes on until endProgram().
+    void setHangingProgram() const { setProgram("echo $$; exec sleep 1000\n"); }
+    void endProgram() {
+        ASSERT_TRUE(loopUntil([&] { return said().ends_with("\n"); }));
+        kill(std::stoi(said()), SIGKILL);
     }
 
     TemporaryDevice device_;
@@ -109,7 +107,7 @@ TEST_F(Launching, LeavesNoZombie) {
 }
 
 TEST_F(Launching, DoesNotWaitForAProgramThatHangs) {
-    setProgram("exec sleep 1000\n");
+    setHangingProgram();
     const auto begin = std::chrono::steady_clock::now();
     EXPECT_EQ(launch(), Result::Accepted);
     EXPECT_LT(std::chrono::steady_clock::now() - begin, std::chrono::seconds(5));
@@ -158,8 +156,9 @@ TEST_F(Launching, SaysThatTheOneThatRunsDoesNotAnswer) {
 }
 
 TEST_F(Launching, OneThatIsOnItsWayCountsAsRunning) {
-    setProgram("exec sleep 1000\n");
+    setHangingProgram();
     launch();
+    ASSERT_TRUE(loopUntil([&] { return !said().empty(); }));
     setProgram("exit 0\n");
     launch();
     EXPECT_EQ(last().outcome, LaunchOutcome::Asked);

@@ -57,6 +57,21 @@ TEST_F(SecondAppOnABus, SaysThatTheFirstDoesNotAnswer) {
     EXPECT_EQ(0, first->terminate());
 }
 
+TEST_F(SecondAppOnABus, SaysThatTheBusDoesNotAnswer) {
+    auto first = start();
+    {
+        const auto on = device::Bus::connect(device::Folder(folder()));
+        ASSERT_TRUE(on && isUp(*on, second));
+    }
+    daemon_.stop();
+    auto again = start(second, {"drink=tea"});
+    EXPECT_EQ(1, again->wait());
+    EXPECT_EQ("second-app: error: com.example.second is running already, but the launch request cannot be handed over: "
+              "there is no bus\n",
+              again->said());
+    first->kill();
+}
+
 TEST_F(SecondAppOnABus, TakesThePlaceOfAFirstThatEndsMeanwhile) {
     device::Folder(folder()).create();
     const std::string lockFile = device::Folder(folder()).applicationLock(second);
