@@ -1,5 +1,6 @@
 #include "PictureTest.h"
 
+#include "KestContentMgr.h"
 #include "KestPaths.h"
 
 #include <fstream>
@@ -125,12 +126,13 @@ TEST_F(PictureFault, APlaceholderThatIsMissingTooLeavesThePageUsable) {
 
 TEST_F(PictureFault, IsReplacedFromTheFixedFolderWhereTheApplicationManagerKnowsNone) {
     writeTips({tip("missing.png")});
-    push();
+    startEmpty();
+    KestContentMgr::getInstance();
     device::faults::plan("app_manager_get_shared_resource_path", -5);
-    ASSERT_TRUE(test_ui::runUntil([&] { return info() != nullptr; }));
-    EXPECT_THAT(buildLog(), ElementsAre(info("__createImage", std::string("imagePath : ") +
-                                                                  kest_paths::sharedResources +
-                                                                  "contents/contents_not_released.png")));
+    open();
+    EXPECT_THAT(buildLog(),
+                ElementsAre(info("__createImage", std::string("imagePath : ") + kest_paths::sharedResources +
+                                                      "contents/contents_not_released.png")));
 }
 
 TEST_F(PictureFault, TwentyThousandPixelsHighShowsThePlaceholder) {

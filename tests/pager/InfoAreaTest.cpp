@@ -1,0 +1,142 @@
+#include "PagerTest.h"
+
+using testing::Contains;
+using testing::HasSubstr;
+using testing::IsEmpty;
+using testing::Not;
+
+/// What there is to read on a page: the title line and the text.
+class InfoArea : public PagerTest {
+protected:
+    void openTip(const std::string& item) {
+        writeTips({item});
+        open();
+    }
+    std::string icon() const { return device()->packages().find(kest)->icon; }
+    static std::string titleMarkup(const std::string& icon, const std::string& title) {
+        return "<align=center><item size=62x62 vsize=full href=file:/" + icon +
+               "></item>  <color=#000000><font_weight='Regular'><font_width='condensed'><font_size=46>" + title +
+               "</font_size></font_width></font_weight></color></align>";
+    }
+    static kest_log::Line isEmpty(int index) {
+        return kest_log::info("KestContentSubView.cpp", "__setText",
+                              "contentList[" + std::to_string(index) + "].textContents is empty");
+    }
+};
+
+TEST_F(InfoArea, ShowsTheTipsIconAndTitle) {
+    openTip(tip("a_01.png"));
+    EXPECT_EQ(test_ui::text(titleLabel()), titleMarkup(icon(), "Title"));
+    EXPECT_EQ(elm_label_line_wrap_get(titleLabel()), ELM_WRAP_MIXED);
+}
+
+TEST_F(InfoArea, ShowsTheText) {
+    openTip(tip("a_01.png", "Open <a href=app>Clock</a>."));
+    EXPECT_EQ(test_ui::text(entry()),
+              "<font_style='Regular' font_size=36 align=left linegap=10>Open <a href=app>Clock</a>.</>");
+    EXPECT_EQ(test_ui::plainText(entry()), "Open Clock.");
+}
+
+TEST_F(InfoArea, IsToRead) {
+    openTip(tip("a_01.png"));
+    EXPECT_FALSE(elm_entry_editable_get(entry()));
+    EXPECT_FALSE(elm_entry_scrollable_get(entry()));
+    EXPECT_TRUE(evas_object_visible_get(entry()));
+    EXPECT_TRUE(evas_object_visible_get(info()));
+}
+
+TEST_F(InfoArea, ScrollsUpAndDownAsAWhole) {
+    openTip(tip("a_01.png"));
+    EXPECT_STREQ(elm_object_style_get(info()), "effect");
+    Eina_Bool horizontal = EINA_TRUE, vertical = EINA_FALSE;
+    elm_scroller_bounce_get(info(), &horizontal, &vertical);
+    EXPECT_FALSE(horizontal);
+    EXPECT_TRUE(vertical);
+    Elm_Scroller_Policy horizontalBar{}, verticalBar{};
+    elm_scroller_policy_get(info(), &horizontalBar, &verticalBar);
+    EXPECT_EQ(horizontalBar, ELM_SCROLLER_POLICY_OFF);
+    EXPECT_EQ(verticalBar, ELM_SCROLLER_POLICY_AUTO);
+}
+
+TEST_F(InfoArea, IsAsWideAsThePageAndAsHighAsItsText) {
+    std::string text;
+    for (int line = 0; line < 40; ++line)
+        text += "A line of text.<br/>";
+    openTip(tip("a_01.png", text));
+    test_ui::runFor(0.1);
+    const test_ui::Rect area = test_ui::geometry(info());
+    const test_ui::Rect whole = test_ui::geometry(infoLayout());
+    EXPECT_EQ(whole.width, area.width);
+    EXPECT_GT(whole.height, 40 * 36);
+    EXPECT_GE(whole.height, test_ui::geometry(entry()).height + test_ui::geometry(titleLabel()).height);
+}
+
+TEST_F(InfoArea, WithoutATextIsEmptyAndToldOf) {
+    openTip("<title>Title</title><image>x</image><contents></contents>");
+    EXPECT_EQ(test_ui::text(entry()), "");
+    EXPECT_THAT(newLog(), Contains(isEmpty(0)));
+    EXPECT_EQ(test_ui::text(titleLabel()), titleMarkup(icon(), "Title"));
+}
+
+TEST_F(InfoArea, TellsWhichTextIsEmpty) {
+    writeTips({tip("a_01.png"), "<title>Title</title><contents></contents>"});
+    open();
+    settle();
+    const auto lines = newLog();
+    EXPECT_THAT(lines, Contains(isEmpty(1)));
+    EXPECT_THAT(lines, Not(Contains(isEmpty(0))));
+}
+
+TEST_F(InfoArea, KeepsItsTitleBlackInTheDarkTheme) {
+    device()->settings().set("db/theme", "dark");
+    openTip(tip("a_01.png"));
+    EXPECT_THAT(test_ui::text(titleLabel()), HasSubstr("<color=#000000>"));
+}
+
+TEST_F(InfoArea, OfALongTitleWrapsAndScrolls) {
+    std::string longTitle;
+    while (longTitle.size() < 10000)
+        longTitle += "title ";
+    openTip("<title>" + longTitle + "</title>" + kest_files::contents("Text"));
+    test_ui::runFor(1);
+    EXPECT_THAT(test_ui::text(titleLabel()), HasSubstr(">" + longTitle + "</font_size>"));
+    EXPECT_LE(test_ui::geometry(titleLabel()).width, 720);
+    EXPECT_GT(test_ui::geometry(infoLayout()).height, test_ui::geometry(info()).height);
+    EXPECT_EQ(title(), "Tips 1/1");
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+TEST_F(InfoArea, OfOneWordOfTenThousandCharactersIsNoWiderThanThePage) {
+    openTip("<title>" + std::string(10000, 'w') + "</title>" + kest_files::contents(std::string(10000, 'w')));
+    test_ui::runFor(1);
+    EXPECT_LE(test_ui::geometry(titleLabel()).width, 720);
+    EXPECT_LE(test_ui::geometry(entry()).width, 720);
+    EXPECT_GT(test_ui::geometry(infoLayout()).height, test_ui::geometry(info()).height);
+}
+
+TEST_F(InfoArea, HasAThousandLinks) {
+    std::string text;
+    for (int link = 0; link < 1000; ++link)
+        text += "<a href=app" + std::to_string(link) + ">link</a> ";
+    openTip(tip("a_01.png", text));
+    test_ui::runFor(1);
+    elm_scroller_region_show(info(), 0, test_ui::geometry(infoLayout()).height - 1, 1, 1);
+    test_ui::runFor(0.1);
+    ASSERT_NE(test_ui::link(entry(), "app999"), test_ui::Rect());
+    screen().tap(test_ui::link(entry(), "app999").middle());
+    EXPECT_EQ(device()->launches().all().size(), 1U);
+}
+
+TEST_F(InfoArea, OfBrokenMarkupShowsWhatItCan) {
+    openTip(tip("a_01.png", "One </b> two <a href=app>three <b>four <> five </a></font></> &nonsense; <item"));
+    test_ui::runFor(1);
+    for (const char* word : {"One", "two", "three", "four", "five"})
+        EXPECT_THAT(test_ui::plainText(entry()), HasSubstr(word));
+}
+
+TEST_F(InfoArea, OfAPictureThatIsNotThereShowsItsText) {
+    openTip(tip("a_01.png", "Before <item size=40x40 href=file:contents/none.png></item> behind"));
+    test_ui::runFor(1);
+    EXPECT_THAT(test_ui::plainText(entry()), HasSubstr("Before"));
+    EXPECT_THAT(test_ui::plainText(entry()), HasSubstr("behind"));
+}

@@ -1,0 +1,208 @@
+#include "PagerTest.h"
+
+#include "KestMainView.h"
+
+using testing::AllOf;
+using testing::Contains;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+/// How the pager comes onto the screen, and how it goes.
+class Opening : public PagerTest {
+protected:
+    static kest_log::Line info(const std::string& function, const std::string& message) {
+        return kest_log::info(pager_log::file, function, message);
+    }
+    static kest_log::Line begin(const std::string& function) { return kest_log::begin(pager_log::file, function); }
+    static kest_log::Line error(const std::string& function, const std::string& message) {
+        return kest_log::error(pager_log::file, function, message);
+    }
+    void writeTipsOfNumber(int count) const {
+        std::vector<std::string> tips;
+        for (int index = 0; index < count; ++index)
+            tips.push_back(tip("none.png", "Text of page " + std::to_string(index)));
+        writeTips(tips);
+    }
+    /// How many transitions of the naviframe come to their end within a second.
+    int transitions() {
+        int count = 0;
+        const auto finished = [](void* data, Evas_Object*, void*) { ++*static_cast<int*>(data); };
+        evas_object_smart_callback_add(naviframe().getEvasObj(), "transition,finished", finished, &count);
+        test_ui::runFor(1);
+        evas_object_smart_callback_del(naviframe().getEvasObj(), "transition,finished", finished);
+        return count;
+    }
+};
+
+TEST_F(Opening, AtTheFirstMenuShowsItsPage) {
+    writeTipsOfNumber(3);
+    open(0);
+    EXPECT_EQ(pageInView(), 0);
+    EXPECT_EQ(title(), "Tips 1/3");
+    EXPECT_EQ(test_ui::plainText(entry(0)), "Text of page 0");
+}
+
+TEST_F(Opening, AtTheLastMenuShowsItsPage) {
+    writeTipsOfNumber(3);
+    open(2);
+    EXPECT_EQ(pageInView(), 2);
+    EXPECT_EQ(title(), "Tips 3/3");
+    settle();
+    EXPECT_EQ(pageInView(), 2);
+    EXPECT_EQ(test_ui::geometry(page(2)).x, 0);
+}
+
+TEST_F(Opening, HasAPageForEachMenuInTheirOrder) {
+    writeTipsOfNumber(4);
+    open(1);
+    settle();
+    for (int index = 0; index < 4; ++index)
+        EXPECT_EQ(test_ui::plainText(entry(index)), "Text of page " + std::to_string(index));
+    EXPECT_EQ(pager().getPageCount(), 4);
+}
+
+TEST_F(Opening, LeavesItsLinesInOrder) {
+    writeTipsOfNumber(3);
+    push(1);
+    test_ui::runFor(1);
+    std::vector<kest_log::Line> lines;
+    for (const kest_log::Line& line : newLog())
+        if (line.file == pager_log::file || line.file == pager_log::pageFile)
+            lines.push_back(line);
+    const auto page = [](const char* function) { return kest_log::begin(pager_log::pageFile, function); };
+    const auto ofPage = [](const std::string& message) {
+        return kest_log::info(pager_log::pageFile, "__fillLayout", message);
+    };
+    const auto imagePath = ofPage("contentList[__index].imagePath is " + picturePath("none.png"));
+    const auto height = ofPage("imageHeight: 0");
+    EXPECT_THAT(lines,
+                ElementsAre(begin("KestContentView"), info("KestContentView", "__selectedView:1"), begin("onCreate"),
+                            begin("onPushed"),                   //
+                            page("onCreate"), page("onPushed"),  //
+                            page("onCreate"), page("onPushed"),  //
+                            page("onCreate"), page("onPushed"),  //
+                            page("onViewPrepare"), page("__fillLayout"), ofPage("index:1"), imagePath, height,
+                            page("onViewDisplay"), info("operator()", "Loading other tabs.."), page("onViewPrepare"),
+                            page("__fillLayout"), ofPage("index:0"), imagePath, height, page("onViewPrepare"),
+                            page("onViewPrepare"), page("__fillLayout"), ofPage("index:2"), imagePath, height));
+}
+
+TEST_F(Opening, SetsItsScrollerUp) {
+    writeTipsOfNumber(2);
+    open();
+    Evas_Object* scroller = pager().getScroller();
+    EXPECT_STREQ(elm_object_style_get(scroller), "effect");
+    Eina_Bool horizontal = EINA_FALSE, vertical = EINA_TRUE;
+    elm_scroller_bounce_get(scroller, &horizontal, &vertical);
+    EXPECT_TRUE(horizontal);
+    EXPECT_FALSE(vertical);
+    Elm_Scroller_Policy horizontalBar{}, verticalBar{};
+    elm_scroller_policy_get(scroller, &horizontalBar, &verticalBar);
+    EXPECT_EQ(horizontalBar, ELM_SCROLLER_POLICY_OFF);
+    EXPECT_EQ(verticalBar, ELM_SCROLLER_POLICY_OFF);
+    EXPECT_THAT(calls::steps({"callback scroll,anim", "auto scroll", "unset title_left_btn"}),
+                AllOf(Contains("auto scroll off"), Contains("unset title_left_btn")));
+}
+
+TEST_F(Opening, ListensToTheEndOfAMovementBeforeItsBegin) {
+    writeTipsOfNumber(2);
+    open();
+    EXPECT_THAT(calls::steps({"callback scroll,anim", "auto scroll"}),
+                testing::IsSupersetOf({"callback scroll,anim,stop", "callback scroll,anim,start", "auto scroll off"}));
+    const auto steps = calls::steps({"callback scroll,anim", "auto scroll"});
+    const auto last = [&](const char* step) { return std::find(steps.rbegin(), steps.rend(), step) - steps.rbegin(); };
+    EXPECT_GT(last("callback scroll,anim,stop"), last("callback scroll,anim,start"));
+    EXPECT_GT(last("callback scroll,anim,start"), last("auto scroll off"));
+}
+
+TEST_F(Opening, OnTopSlidesIn) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    settle();
+    push(0, true);
+    EXPECT_EQ(topView(), "KestContentView");
+    EXPECT_EQ(transitions(), 1);
+}
+
+TEST_F(Opening, NotOnTopIsThereAtOnce) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    settle();
+    push(0, false);
+    EXPECT_EQ(topView(), "KestContentView");
+    EXPECT_EQ(transitions(), 0);
+    EXPECT_EQ(pageInView(), 0);
+    EXPECT_EQ(title(), "Tips 1/2");
+}
+
+TEST_F(Opening, StaysOnTopOfAListThatSlidesInBeneath) {
+    writeTipsOfNumber(2);
+    open(1);
+    naviframe().push(new KestMainView(false), nullptr, nullptr);
+    settle();
+    EXPECT_EQ(topView(), "KestContentView");
+    EXPECT_EQ(pageInView(), 1);
+    EXPECT_EQ(title(), "Tips 2/2");
+    closePager();
+    settle();
+    EXPECT_EQ(topView(), "KestMainView");
+}
+
+TEST_F(Opening, HasABackButtonThatClosesIt) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    open();
+    settle();
+    Evas_Object* back = elm_object_item_part_content_get(pager().getNaviItem(), "elm.swallow.prev_btn");
+    EXPECT_STREQ(elm_object_style_get(back), "naviframe/back_btn/default");
+    screen().tap(back);
+    settle();
+    EXPECT_EQ(topView(), "OtherView");
+}
+
+TEST_F(Opening, HasABackButtonThatNeedsItsView) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    push();
+    const Evas_Smart_Cb back = calls::smartCallback("clicked");
+    settle();
+    newLog();
+    back(nullptr, nullptr, nullptr);
+    settle();
+    EXPECT_THAT(newLog(), ElementsAre(error("__backCb", "Invalid Param : data")));
+    EXPECT_EQ(topView(), "KestContentView");
+}
+
+TEST_F(Opening, BeforeItWasMadeEndsTheProcess) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    Pager view(2, true);
+    newLog();
+    EXPECT_DEATH(view.onPushToNaviframe(naviframe().getEvasObj()),
+                 AllOf(HasSubstr("KestContentView.cpp:"),
+                       HasSubstr("onPushToNaviframe: Assertion `(getEvasObj() != nullptr)' failed.")));
+    EXPECT_THAT(newErrors(), ElementsAre(error("onPushToNaviframe", "WASSERT! getEvasObj() != nullptr")));
+}
+
+TEST_F(Opening, WithoutAnyMenuShowsNoPage) {
+    writeMenus({});
+    push();
+    settle();
+    EXPECT_EQ(pager().getPageCount(), 0);
+    EXPECT_EQ(topView(), "KestContentView");
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+TEST_F(Opening, AtAMenuThatIsNotThereShowsTheFirstPage) {
+    writeTipsOfNumber(2);
+    push(7);
+    settle();
+    EXPECT_EQ(pageInView(), 0);
+    EXPECT_EQ(test_ui::plainText(entry(1)), "Text of page 1");
+    EXPECT_THAT(newErrors(), IsEmpty());
+}

@@ -1,0 +1,121 @@
+#include "PagerTest.h"
+
+using testing::Contains;
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::Not;
+
+/// The chosen page is filled as soon as there is time, the others 0.4 seconds later.
+class Preparation : public PagerTest {
+protected:
+    Preparation() { writeTips({tip("none.png", "A"), tip("none.png", "B"), tip("none.png", "C")}); }
+
+    bool isFilled(int index) { return info(index) != nullptr; }
+    std::vector<bool> filled() { return {isFilled(0), isFilled(1), isFilled(2)}; }
+    static kest_log::Line loadsOthers() {
+        return kest_log::info(pager_log::file, "operator()", "Loading other tabs..");
+    }
+    static long count(const std::vector<kest_log::Line>& lines, const kest_log::Line& line) {
+        return std::count(lines.begin(), lines.end(), line);
+    }
+};
+
+TEST_F(Preparation, FillsNothingWhileThePagerIsPushed) {
+    startEmpty();
+    std::vector<bool> before;
+    test_ui::inMainLoop([&] {
+        Pager* view = new Pager(2, true);
+        naviframe().push(view, nullptr, nullptr);
+        Eina_List* pages = elm_box_children_get(elm_object_content_get(view->getScroller()));
+        const Eina_List* node = nullptr;
+        void* each = nullptr;
+        EINA_LIST_FOREACH(pages, node, each)
+        before.push_back(elm_object_part_content_get(static_cast<Evas_Object*>(each), "info") != nullptr);
+        eina_list_free(pages);
+    });
+    EXPECT_THAT(before, ElementsAre(false, false, false));
+}
+
+TEST_F(Preparation, FillsTheChosenPageFirst) {
+    open(1);
+    EXPECT_THAT(filled(), ElementsAre(false, true, false));
+}
+
+TEST_F(Preparation, FillsTheOthersAfterFourTenthsOfASecond) {
+    open(1);
+    test_ui::runFor(0.35);
+    EXPECT_THAT(filled(), ElementsAre(false, true, false));
+    EXPECT_THAT(newLog(), Not(Contains(loadsOthers())));
+    test_ui::runFor(0.1);
+    EXPECT_THAT(filled(), ElementsAre(true, true, true));
+    EXPECT_THAT(newLog(), Contains(loadsOthers()));
+}
+
+TEST_F(Preparation, FillsEachPageOnce) {
+    open();
+    test_ui::runFor(10);
+    const auto lines = newLog();
+    EXPECT_EQ(count(lines, loadsOthers()), 1);
+    EXPECT_EQ(count(lines, kest_log::begin(pager_log::pageFile, "__fillLayout")), 3);
+}
+
+TEST_F(Preparation, DisplaysTheChosenPageOnce) {
+    open();
+    test_ui::runFor(10);
+    EXPECT_EQ(count(newLog(), kest_log::begin(pager_log::pageFile, "onViewDisplay")), 1);
+    EXPECT_EQ(calls::steps({"title"}), (std::vector<std::string>{"title elm.text.title kest Tips 1/3"}));
+}
+
+TEST_F(Preparation, ShowsAPageThatASwipeReachedBefore) {
+    open();
+    swipe();
+    EXPECT_THAT(filled(), ElementsAre(true, false, false));
+    test_ui::runFor(1);
+    EXPECT_EQ(pageInView(), 1);
+    EXPECT_EQ(test_ui::plainText(entry(1)), "B");
+    EXPECT_EQ(title(), "Tips 2/3");
+}
+
+TEST_F(Preparation, PlaysAPageThatASwipeReachedBefore) {
+    drawSequence(2);
+    writeTips({tip("none.png"), tip("a_01.png")});
+    open();
+    swipe();
+    test_ui::runFor(10);
+    EXPECT_THAT(calls::story(1), Contains(testing::EndsWith("area reply,show")));
+}
+
+TEST_F(Preparation, TitlesAPageThatARequestShowedBefore) {
+    open();
+    test_ui::inMainLoop([&] { pager().showContentsPage(2); });
+    EXPECT_EQ(title(), "Tips 3/3");
+    settle();
+    EXPECT_EQ(test_ui::plainText(entry(2)), "C");
+}
+
+TEST_F(Preparation, EndsWithThePagerBeforeItIsIdle) {
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    settle();
+    test_ui::inMainLoop([&] {
+        naviframe().push(new Pager(2, false), nullptr, nullptr);
+        newLog();
+        elm_object_item_del(elm_naviframe_top_item_get(naviframe().getEvasObj()));
+    });
+    test_ui::runFor(2);
+    EXPECT_EQ(topView(), "OtherView");
+    EXPECT_THAT(newLog(), Not(Contains(kest_log::begin(pager_log::pageFile, "onViewPrepare"))));
+}
+
+TEST_F(Preparation, EndsWithThePagerBeforeTheOthersAreFilled) {
+    startEmpty();
+    naviframe().push(new OtherView, nullptr, nullptr);
+    settle();
+    open();
+    test_ui::runFor(0.25);
+    test_ui::inMainLoop([&] { elm_object_item_del(pager().getNaviItem()); });
+    newLog();
+    test_ui::runFor(2);
+    EXPECT_EQ(topView(), "OtherView");
+    EXPECT_THAT(newLog(), IsEmpty());
+}
