@@ -1,7 +1,8 @@
-// Loaded ahead of a program (LD_PRELOAD): writes to the file descriptor that FIRST_FRAME_FD names when the program has
+// Loaded ahead of a program (LD_PRELOAD): tells whoever started it when the program has
 // drawn the first frame with a row of a list in it, and ends the program there.
 
 #include "FirstFrame.h"
+#include "Program.h"
 
 #include <Elementary.h>
 
@@ -23,7 +24,7 @@ void tellAndEnd() {
     bench::FirstFrame told{};
     clock_gettime(CLOCK_MONOTONIC, &told.time);
     getrusage(RUSAGE_SELF, &told.usage);
-    const char* descriptor = getenv("FIRST_FRAME_FD");
+    const char* descriptor = getenv(bench::toldVariable);
     const bool written = descriptor && write(atoi(descriptor), &told, sizeof told) == sizeof told;
     _exit(written ? 0 : 1);
 }

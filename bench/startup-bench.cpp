@@ -3,19 +3,20 @@
 // medians. Joins the bus of its environment as the application does: to be run under one of its own.
 
 #include "FirstFrame.h"
+#include "Measure.h"
+#include "Program.h"
+#include "Statistics.h"
 #include "support/TemporaryFolder.h"
 
-#include <algorithm>
 #include <array>
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 #include <ctime>
-#include <fcntl.h>
 #include <filesystem>
 #include <stdexcept>
 #include <string>
-#include <sys/wait.h>
-#include <unistd.h>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -26,52 +27,20 @@ struct Sample {
     double megabytes;
 };
 
-double milliseconds(const timespec& time) {
-    return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_nsec) / 1e6;
-}
-
 double milliseconds(const timeval& time) {
     return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_usec) / 1e3;
 }
 
-[[noreturn]] void become(const std::vector<std::string>& command, int told) {
-    setenv("FIRST_FRAME_FD", std::to_string(told).c_str(), 1);
-    setenv("LD_PRELOAD", FIRST_FRAME, 1);
-    std::vector<char*> arguments;
-    arguments.reserve(command.size() + 1);
-    for (const std::string& word : command) {
-        arguments.push_back(const_cast<char*>(word.c_str()));
-    }
-    arguments.push_back(nullptr);
-    const int silence = open("/dev/null", O_WRONLY);
-    dup2(silence, STDOUT_FILENO);
-    dup2(silence, STDERR_FILENO);
-    execv(arguments[0], arguments.data());
-    _exit(127);
-}
-
 Sample start(const std::vector<std::string>& command) {
-    int told[2];
-    if (pipe(told) != 0) {
-        throw std::runtime_error("no pipe");
-    }
     timespec begin{};
     clock_gettime(CLOCK_MONOTONIC, &begin);
-    const pid_t process = fork();
-    if (process == 0) {
-        close(told[0]);
-        become(command, told[1]);
-    }
-    close(told[1]);
+    const std::string told = bench::toldBy(command, FIRST_FRAME);
     bench::FirstFrame frame{};
-    const bool read = ::read(told[0], &frame, sizeof frame) == sizeof frame;
-    close(told[0]);
-    int status = 0;
-    waitpid(process, &status, 0);
-    if (!read) {
+    if (told.size() != sizeof frame) {
         throw std::runtime_error(command.front() + " ended before its first frame");
     }
-    return {milliseconds(frame.time) - milliseconds(begin),
+    std::memcpy(&frame, told.data(), sizeof frame);
+    return {bench::milliseconds(frame.time) - bench::milliseconds(begin),
             milliseconds(frame.usage.ru_utime) + milliseconds(frame.usage.ru_stime),
             static_cast<double>(frame.usage.ru_maxrss) / 1024};
 }
@@ -88,8 +57,7 @@ struct Case {
         for (const Sample& sample : samples) {
             all.push_back(sample.*value);
         }
-        std::sort(all.begin(), all.end());
-        return all[all.size() / 2];
+        return bench::median(std::move(all));
     }
 };
 
@@ -106,19 +74,6 @@ std::vector<std::string> bareWindow() {
     return command;
 }
 
-void prepareEnvironment(const std::filesystem::path& folder) {
-    std::filesystem::create_directories(folder / "home");
-    std::filesystem::create_directories(folder / "run");
-    std::filesystem::permissions(folder / "run", std::filesystem::perms::owner_all);
-    setenv("HOME", (folder / "home").c_str(), 1);
-    setenv("XDG_RUNTIME_DIR", (folder / "run").c_str(), 1);
-    setenv("KEST_DEVICE", (folder / "device").c_str(), 1);
-    setenv("ELM_ENGINE", "buffer", 1);
-    setenv("LANG", "C.UTF-8", 1);
-    unsetenv("DISPLAY");
-    unsetenv("WAYLAND_DISPLAY");
-}
-
 void print(const std::array<Case, 3>& cases) {
     std::printf("%-38s %8s %6s %14s %6s %8s %6s\n", "start to the first frame with rows", "ms", "ratio", "processor ms",
                 "ratio", "peak MB", "ratio");
@@ -133,7 +88,7 @@ void print(const std::array<Case, 3>& cases) {
 
 int run(int rounds) {
     const support::TemporaryFolder folder;
-    prepareEnvironment(folder.path());
+    bench::prepareEnvironment(folder.path());
     std::array<Case, 3> cases = {Case{"bare window with a list", bareWindow(), false, {}},
                                  Case{"application (aim: 1.30)", {APPLICATION}, false, {}},
                                  Case{"application, its device's first start", {APPLICATION}, true, {}}};

@@ -85,7 +85,6 @@ void KestPictureBuilder::__buildSingle(Evas_Object* pageLayout, const std::strin
     int width = 0;
     int height = 0;
     elm_image_object_size_get(measured, &width, &height);
-    evas_object_del(measured);
     KEST_INFO("weight:%d, height:%d", width, height);
     if (width <= 0 || height <= 0) {
         KEST_WARN("no picture: %s", imagePath.c_str());
@@ -96,6 +95,9 @@ void KestPictureBuilder::__buildSingle(Evas_Object* pageLayout, const std::strin
         area.extraHeight = height - areaHeight;
         __buildTall(pageLayout, imagePath);
     }
+    // Not before the page has the picture: to delete the only image of a file ends its loading, and the frame that
+    // shows the page would wait for it.
+    evas_object_del(measured);
 }
 
 void KestPictureBuilder::__buildTall(Evas_Object* pageLayout, const std::string& imagePath) {
