@@ -8,6 +8,7 @@
 
 #include <dlfcn.h>
 #include <locale.h>
+#include <string.h>
 
 using test_ui::Rect;
 
@@ -177,6 +178,51 @@ TEST_F(EflAnswers, AThemeFileIsAddedOnce) {
     elm_theme_extension_add(own, file.c_str());
     EXPECT_EQ(1u, eina_list_count(elm_theme_extension_list_get(own)));
     elm_theme_free(own);
+}
+
+/// A list whose rows are as wide as itself, scrolled to the middle.
+class EflAnswersForLists : public EflAnswers {
+protected:
+    EflAnswersForLists() {
+        style_->item_style = "default";
+        style_->func.text_get = [](void*, Evas_Object*, const char*) { return strdup("a row"); };
+        elm_genlist_mode_set(list_, ELM_LIST_COMPRESS);
+        elm_genlist_homogeneous_set(list_, EINA_TRUE);
+        for (int i = 0; i < 100; ++i)
+            rows_.push_back(
+                elm_genlist_item_append(list_, style_, nullptr, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr));
+        evas_object_resize(list_, 720, 600);
+        evas_object_show(list_);
+        test_ui::runFor(0.5);
+        elm_genlist_item_show(rows_[50], ELM_GENLIST_ITEM_SCROLLTO_TOP);
+        test_ui::runFor(0.5);
+    }
+    ~EflAnswersForLists() override { elm_genlist_item_class_free(style_); }
+
+    void expectRows() {
+        EXPECT_EQ(0, test_ui::rowGeometry(rows_[50]).y);
+        EXPECT_EQ(720, test_ui::rowGeometry(rows_[50]).width);
+    }
+
+    Evas_Object* list_ = elm_genlist_add(window());
+    Elm_Genlist_Item_Class* style_ = elm_genlist_item_class_new();
+    std::vector<Elm_Object_Item*> rows_;
+};
+
+TEST_F(EflAnswersForLists, AListKeepsItsRowsAndItsPlaceWhenItIsMirrored) {
+    expectRows();
+    for (const bool mirrored : {true, false, true}) {
+        elm_config_mirrored_set(mirrored);
+        test_ui::runFor(0.5);
+        expectRows();
+    }
+}
+
+TEST_F(EflAnswersForLists, AListMayGoRightAfterItWasMirrored) {
+    elm_config_mirrored_set(EINA_TRUE);
+    evas_object_del(list_);
+    test_ui::runFor(0.5);
+    EXPECT_THAT(toolkit_.log().lines(), testing::IsEmpty());
 }
 
 class EflLanguage : public EflAnswers {
