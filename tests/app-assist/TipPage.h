@@ -36,7 +36,7 @@ public:
     }
     void setText() {
         std::string text = "<font_size=36 align=left>" + text_;
-        for (int i = 0; i < 40; ++i)
+        for (int i = 0; i < 300; ++i)
             text += " one two three four five six";
         elm_object_text_set(entry, (text + " <a href=more>more</a></>").c_str());
     }

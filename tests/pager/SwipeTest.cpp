@@ -47,7 +47,7 @@ TEST_F(Swipe, DisplaysThePageWhenItHasComeToRest) {
     EXPECT_THAT(calls::story(1), IsEmpty());
     test_ui::runFor(0.5);
     EXPECT_EQ(title(), "Tips 2/3");
-    EXPECT_THAT(calls::story(1), ElementsAre("0.6 info show"));
+    EXPECT_THAT(calls::story(1), ElementsAre("0.7 info show"));
 }
 
 TEST_F(Swipe, GoesToTheLastPageAndBack) {
@@ -115,8 +115,8 @@ TEST_F(Swipe, PlaysThePageThatItComesTo) {
     swipe();
     test_ui::runFor(10);
     EXPECT_THAT(calls::story(1),
-                ElementsAre("0.2 pictures at page 0", "0.2 picture 0 touch,hide", "0.6 pictures at page 0",
-                            "0.6 area reply,uppressed", "0.6 info show", "0.6 picture 0 touch,hide",
+                ElementsAre("0.2 pictures at page 0", "0.2 picture 0 touch,hide", "0.7 pictures at page 0",
+                            "0.7 area reply,uppressed", "0.7 info show", "0.7 picture 0 touch,hide",
                             "0.7 area reply,hide", "1.7 picture 0 touch,show", "3.7 pictures to page 1",
                             "5.7 pictures to page 0", "5.7 picture 0 touch,hide", "5.7 area reply,show"));
 }
