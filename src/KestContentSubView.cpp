@@ -44,7 +44,8 @@ Evas_Object* KestContentSubView::onCreate(Evas_Object* parent, void*) {
     layout = elm_layout_add(parent);
     elm_layout_file_set(layout, themeFile.c_str(), "kest/content/main");
     expand(layout);
-    uxt_theme_add_changed_callback(nullptr, __themeChangedCb, this);
+    // For this page: another pager may lie beneath, and its pages go on listening when this one's go.
+    uxt_theme_add_changed_callback(layout, __themeChangedCb, this);
     evas_object_smart_callback_add(layout, "language,changed", __languageChangedCb, this);
     return layout;
 }
@@ -55,7 +56,7 @@ void KestContentSubView::onPushed(Elm_Object_Item*) {
 
 void KestContentSubView::onDestroy() {
     KEST_HIT();
-    uxt_theme_delete_changed_callback(nullptr, __themeChangedCb);
+    uxt_theme_delete_changed_callback(layout, __themeChangedCb);
 }
 
 void KestContentSubView::onViewPrepare() {

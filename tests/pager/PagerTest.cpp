@@ -126,7 +126,7 @@ void PagerTest::say(const char* signal, int index) {
 void PagerTest::swipe(int pages) {
     const test_ui::Point middle = test_ui::geometry(pager().getScroller()).middle();
     const int y = test_ui::geometry(video(pageInView())).middle().y;
-    screen().swipe({middle.x + 200 * pages, y}, {middle.x - 200 * pages, y});
+    screen().swipe({middle.x + 260 * pages, y}, {middle.x - 260 * pages, y}, 0.2);
 }
 
 std::vector<kest_log::Line> PagerTest::newLogOf(const std::string& file) {
