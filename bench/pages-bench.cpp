@@ -41,6 +41,7 @@ using Programs = std::array<Program, 2>;
 
 std::vector<double> of(const std::vector<Cost>& costs, double Cost::*which) {
     std::vector<double> values;
+    values.reserve(costs.size());
     for (const Cost& cost : costs) {
         values.push_back(cost.*which);
     }
@@ -50,6 +51,7 @@ std::vector<double> of(const std::vector<Cost>& costs, double Cost::*which) {
 /// The median of what each visit gives.
 double overVisits(const std::vector<std::vector<Cost>>& visits, double Cost::*which, double share) {
     std::vector<double> values;
+    values.reserve(visits.size());
     for (const std::vector<Cost>& visit : visits) {
         values.push_back(quantile(of(visit, which), share));
     }

@@ -14,7 +14,7 @@ namespace {
 
 /// Takes over a text that a service gave; "" for NULL.
 std::string owned(char* text) {
-    const std::string copy = text ? text : "";
+    std::string copy = text ? text : "";
     std::free(text);
     return copy;
 }

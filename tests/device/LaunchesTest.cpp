@@ -6,7 +6,6 @@
 
 namespace {
 
-using device::Launches;
 using device::LaunchOutcome;
 using device::LaunchRecord;
 using support::TemporaryDevice;

@@ -46,9 +46,9 @@ const ThemeParts::Group& ThemeParts::groupOf(const Evas_Object* themed) {
     const char* file = nullptr;
     const char* group = nullptr;
     edje_object_file_get(themed, &file, &group);
-    const std::string key = file && group ? std::string(file) + '\n' + group : "";
-    const auto [known, isNew] = groups_.try_emplace(key);
-    if (isNew && !key.empty()) {
+    const bool isThemed = file && group;
+    const auto [known, isNew] = groups_.try_emplace(isThemed ? std::string(file) + '\n' + group : "");
+    if (isThemed && isNew) {
         read(file, group, known->second);
     }
     return known->second;
