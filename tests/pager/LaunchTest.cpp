@@ -2,10 +2,8 @@
 
 #include <device/Launches.h>
 
-using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using testing::Pair;
 
 /// A link in the text opens the application that the tip is about.
 class Launch : public PagerTest {
