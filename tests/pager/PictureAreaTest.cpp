@@ -18,9 +18,10 @@ TEST_F(PictureArea, OfOnePictureIsItsPage) {
 TEST_F(PictureArea, ShowsThePicture) {
     drawPicture("a_01.png", 716, 655, 0xAA3300);
     openPage();
-    test_ui::runFor(0.1);
+    settle();
     const test_ui::Point middle = test_ui::geometry(video()).middle();
-    EXPECT_EQ(screen().picture().pixel(middle.x, middle.y), 0xAA3300U);
+    // A thread reads the file in its own time.
+    EXPECT_TRUE(test_ui::runUntil([&] { return screen().picture().pixel(middle.x, middle.y) == 0xAA3300U; }, 600));
 }
 
 TEST_F(PictureArea, OfOnePictureIsToldOfInTheLog) {
