@@ -4,6 +4,7 @@
 #include "KestContentMgr.h"
 #include "KestLog.h"
 #include "KestPictureBuilder.h"
+#include "KestSizeHints.h"
 #include "KestTipMarkup.h"
 
 #include <app-assist/WUiTimer.h>
@@ -23,15 +24,6 @@ const char ownDomain[] = "kest";
 /// The catalogue is loaded anew after the pages have heard of the language.
 const double secondsToNewLanguage = 0.5;
 
-void expand(Evas_Object* object) {
-    evas_object_size_hint_weight_set(object, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-}
-
-void fill(Evas_Object* object) {
-    evas_object_size_hint_align_set(object, EVAS_HINT_FILL, EVAS_HINT_FILL);
-    expand(object);
-}
-
 }  // namespace
 
 KestContentSubView::KestContentSubView(Evas_Object* scroller, int pageIndex, int shownIndex)
@@ -43,7 +35,7 @@ Evas_Object* KestContentSubView::onCreate(Evas_Object* parent, void*) {
     const std::string themeFile = KestCommon::getEdjFilePath(true);
     layout = elm_layout_add(parent);
     elm_layout_file_set(layout, themeFile.c_str(), "kest/content/main");
-    expand(layout);
+    KestSizeHints::expand(layout);
     // For this page: another pager may lie beneath, and its pages go on listening when this one's go.
     uxt_theme_add_changed_callback(layout, __themeChangedCb, this);
     evas_object_smart_callback_add(layout, "language,changed", __languageChangedCb, this);
@@ -117,20 +109,24 @@ void KestContentSubView::__setInfoArea(Evas_Object* pageLayout) {
     elm_object_style_set(infoScroller, "effect");
 
     Evas_Object* infoLayout = elm_layout_add(infoScroller);
-    fill(infoLayout);
+    KestSizeHints::fill(infoLayout);
     elm_layout_file_set(infoLayout, KestCommon::getEdjFilePath(true).c_str(), "kest/content/scroller");
     elm_object_content_set(infoScroller, infoLayout);
 
     entry = elm_entry_add(infoLayout);
     elm_object_part_content_set(infoLayout, "entry", entry);
-    fill(entry);
+    KestSizeHints::fill(entry);
     evas_object_smart_callback_add(
         entry, "anchor,clicked",
         [](void* data, Evas_Object*, void*) {
             KEST_HIT();
-            KestContentInfo tapped;
-            if (static_cast<const KestContentSubView*>(data)->__copyRecord(tapped)) {
-                __launch(tapped);
+            try {
+                KestContentInfo tapped;
+                if (static_cast<const KestContentSubView*>(data)->__copyRecord(tapped)) {
+                    __launch(tapped);
+                }
+            } catch (const std::exception& error) {
+                KEST_ERR("%s", error.what());
             }
         },
         this);

@@ -5,6 +5,7 @@
 #include "KestContentView.h"
 #include "KestFiles.h"
 #include "KestLog.h"
+#include "KestSizeHints.h"
 #include "KestUsageLog.h"
 
 #include <app-assist/WNaviframe.h>
@@ -18,15 +19,6 @@ namespace {
 
 /// The list's indices count from 1, and row 1 is the title row.
 const int firstMenuIndex = 2;
-
-void expand(Evas_Object* object) {
-    evas_object_size_hint_weight_set(object, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-}
-
-void fill(Evas_Object* object) {
-    evas_object_size_hint_align_set(object, EVAS_HINT_FILL, EVAS_HINT_FILL);
-    expand(object);
-}
 
 }  // namespace
 
@@ -50,7 +42,7 @@ Evas_Object* KestMainView::onCreate(Evas_Object* parent, void*) {
     const std::string path = KestCommon::getEdjFilePath(true);
     Evas_Object* layout = elm_layout_add(parent);
     elm_layout_file_set(layout, path.c_str(), "kest/list/main");
-    expand(layout);
+    KestSizeHints::expand(layout);
 
     __genlist = __createGenlist(layout);
     // __createGenlist() does not return without one.
@@ -97,7 +89,7 @@ Evas_Object* KestMainView::__createGenlist(Evas_Object* parent) {
     __genlist = elm_genlist_add(parent);
     WASSERT_EX(__genlist, "(__genlist != __null)", "genlist is not created.");
 
-    fill(__genlist);
+    KestSizeHints::fill(__genlist);
     elm_genlist_mode_set(__genlist, ELM_LIST_COMPRESS);
     elm_genlist_homogeneous_set(__genlist, EINA_TRUE);
     evas_object_smart_callback_add(__genlist, "language,changed", __languageChangedCb, this);
@@ -179,13 +171,13 @@ Evas_Object* KestMainView::__getRowContent(void* data, Evas_Object* obj, const c
     }
     Evas_Object* layout = elm_layout_add(obj);
     elm_layout_theme_set(layout, "layout", "list/B/type.2", "default");
-    fill(layout);
+    KestSizeHints::fill(layout);
 
     Evas_Object* image = elm_image_add(layout);
     if (!KestFiles::isSpecial(record->iconPath)) {
         elm_image_file_set(image, record->iconPath.c_str(), nullptr);
     }
-    fill(image);
+    KestSizeHints::fill(image);
     elm_object_part_content_set(layout, "elm.swallow.content", image);
     return layout;
 }

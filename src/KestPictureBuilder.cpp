@@ -5,6 +5,7 @@
 #include "KestPaths.h"
 #include "KestPicturePaths.h"
 #include "KestPlatformString.h"
+#include "KestSizeHints.h"
 
 #include <app_resource_manager.h>
 #include <system_settings.h>
@@ -28,10 +29,6 @@ const int lowDensityCut = 138;
 
 /// A picture that has more is left out: decoded, it takes four bytes each.
 const std::int64_t mostPixels = 4 * 1024 * 1024;
-
-void expand(Evas_Object* object) {
-    evas_object_size_hint_weight_set(object, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-}
 
 /// Nothing where the object could not be made.
 void put(Evas_Object* layout, const char* part, Evas_Object* object) {
@@ -229,14 +226,13 @@ Evas_Object* KestPictureBuilder::__createImage(Evas_Object* parent, const std::s
         KEST_WARN("%d x %d pixels are too many: %s", width, height, path.c_str());
         elm_image_file_set(image, nullptr, nullptr);
     }
-    evas_object_size_hint_align_set(image, EVAS_HINT_FILL, EVAS_HINT_FILL);
-    expand(image);
+    KestSizeHints::fill(image);
     return image;
 }
 
 void KestPictureBuilder::__setSizer(Evas_Object* page, const Size& least) const {
     Evas_Object* rectangle = evas_object_rectangle_add(evas_object_evas_get(page));
-    expand(rectangle);
+    KestSizeHints::expand(rectangle);
     evas_object_size_hint_min_set(rectangle, least.width, least.height);
     put(page, "sizer", rectangle);
 }
@@ -245,7 +241,7 @@ Evas_Object* KestPictureBuilder::__createLayout(Evas_Object* parent, const char*
     Evas_Object* layout = elm_layout_add(parent);
     if (layout) {
         elm_layout_file_set(layout, themeFile.c_str(), group);
-        expand(layout);
+        KestSizeHints::expand(layout);
         evas_object_show(layout);
     }
     return layout;
