@@ -1,84 +1,14 @@
-#include "device/ApplicationLock.h"
-#include "device/MainLoop.h"
-#include "support/Process.h"
-#include "support/TemporaryDevice.h"
+#include "LauncherTest.h"
 
-#include <Ecore.h>
-#include <gmock/gmock.h>
-#include <gtest/gtest.h>
-
-#include <chrono>
-#include <functional>
 #include <sys/wait.h>
 
 namespace {
 
-using device::Launcher;
 using device::LaunchOutcome;
-using device::LaunchRecord;
-using support::TemporaryDevice;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Pair;
-using Result = Launcher::Result;
-
-constexpr char tea[] = "com.example.tea";
-
-/// A device with an application com.example.tea, whose program a test writes.
-class Launching : public testing::Test {
-protected:
-    Launching() { device_.addPackage(tea); }
-
-    std::filesystem::path program() const { return device_.preinstalled() / tea / "bin/app"; }
-    void setProgram(const std::string& script) const {
-        support::writeFile(program(), "#!/bin/sh\n" + script);
-        std::filesystem::permissions(program(), std::filesystem::perms::owner_all);
-    }
-    Result launch(const std::vector<std::pair<std::string, std::string>>& extras = {}, const std::string& id = tea) {
-        return device_->launcher().launch({device_.appId(), id, extras});
-    }
-    std::vector<LaunchRecord> records() const { return device_->launches().all(); }
-    LaunchRecord last() const { return records().back(); }
-    std::string said() const { return support::readFile(device_->folder().output(tea)); }
-
-    /// Runs the main loop until `done` says so; it need never be waited for as long as that.
-    static bool loopUntil(const std::function<bool()>& done) {
-        device::startMainLoop();
-        const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(20);
-        Ecore_Timer* waking = ecore_timer_add(
-            0.02, [](void*) -> Eina_Bool { return ECORE_CALLBACK_RENEW; }, nullptr);
-        while (!done() && std::chrono::steady_clock::now() < end)
-            ecore_main_loop_iterate_may_block(1);
-        ecore_timer_del(waking);
-        return done();
-    }
-    bool saysSoon(const std::string& text) {
-        return loopUntil([&] { return said() == text; });
-    }
-    bool becomes(LaunchOutcome outcome) {
-        return loopUntil([&] { return last().outcome == outcome; });
-    }
-    /// The process that is the application meanwhile, on this device.
-    support::Process running() const {
-        auto process = support::Process::ofWork([this] {
-            const device::ApplicationLock lock(device_->folder(), tea);
-            return pause();
-        });
-        while (!device::ApplicationLock::holder(device_->folder(), tea))
-            usleep(1000);
-        return process;
-    }
-
-    /// A program that goes on until endProgram().
-    void setHangingProgram() const { setProgram("echo $$; exec sleep 1000\n"); }
-    void endProgram() {
-        ASSERT_TRUE(loopUntil([&] { return said().ends_with("\n"); }));
-        kill(std::stoi(said()), SIGKILL);
-    }
-
-    TemporaryDevice device_;
-};
 
 TEST_F(Launching, StartsTheProgramWithItsExtrasOnThisDevice) {
     setProgram("echo \"$#\" \"$1\" \"$2\"; echo \"$KEST_DEVICE\"\n");
@@ -234,10 +164,25 @@ TEST_F(Launching, RefusesExtrasThatCannotBeHandedOver) {
     EXPECT_EQ(said(), "");
 }
 
-TEST_F(Launching, TakesExtrasOfNearly64KiB) {
+TEST_F(Launching, TakesExtrasOf64KiBInAll) {
     setProgram("echo ${#1}\n");
-    EXPECT_EQ(launch({{"text", std::string(65000, 'x')}}), Result::Accepted);
-    EXPECT_TRUE(saysSoon("65005\n")) << said();
+    // With the application's id, the key and what passing it on costs.
+    const std::size_t most = 64 * 1024 - std::string(tea).size() - 4 - 8;
+    EXPECT_EQ(launch({{"text", std::string(most + 1, 'x')}}), Result::Rejected);
+    EXPECT_EQ(launch({{"text", std::string(most, 'x')}}), Result::Accepted);
+    EXPECT_TRUE(saysSoon(std::to_string(most + 5) + "\n")) << said();
+}
+
+TEST_F(Launching, CountsEightBytesMoreForEachExtra) {
+    setProgram("echo $#\n");
+    std::vector<std::pair<std::string, std::string>> extras;
+    for (std::size_t size = std::string(tea).size() + 12; size <= 64 * 1024; size += 12)
+        extras.emplace_back(std::to_string(1000 + extras.size()), "");
+    EXPECT_EQ(launch(extras), Result::Accepted);
+    EXPECT_TRUE(saysSoon("5460\n")) << said();
+    extras.emplace_back("more", "");
+    EXPECT_EQ(launch(extras), Result::Rejected);
+    EXPECT_EQ(last().reason, "the request is larger than 64 KiB");
 }
 
 TEST_F(Launching, GoesOnWithoutARecordWhereTheDiskIsFull) {

@@ -10,6 +10,7 @@
 #include <Ecore.h>
 
 #include <algorithm>
+#include <exception>
 #include <optional>
 #include <utility>
 
@@ -90,7 +91,7 @@ Launcher::Result Launcher::carryOut(const LaunchRequest& request) {
     start.environment = {{"DEVICE_FAULTS", ""}};
     const Process process = startApplication(device_.folder(), *package, start);
     const long long id = record(request, start.again ? LaunchOutcome::Asked : LaunchOutcome::Started, "");
-    children_.push_back({process, id, request, start.again, std::chrono::steady_clock::now()});
+    children_.push_back({process, id, request, start.again, clock_()});
     return Result::Accepted;
 }
 
@@ -135,16 +136,19 @@ void Launcher::watchChildren() {
     if (endHandler_)
         return;
     startMainLoop();
-    endHandler_ = ecore_event_handler_add(
-        ECORE_EXE_EVENT_DEL,
-        [](void* launcher, int, void* event) -> Eina_Bool {
-            const auto* end = static_cast<Ecore_Exe_Event_Del*>(event);
-            static_cast<Launcher*>(launcher)->childEnded(
-                end->pid, end->signalled ? endBySignal(end->exit_signal) : endWithStatus(end->exit_code),
-                end->exited && end->exit_code == 0);
-            return ECORE_CALLBACK_PASS_ON;
-        },
-        this);
+    endHandler_ = ecore_event_handler_add(ECORE_EXE_EVENT_DEL, whenChildEnds, this);
+}
+
+Eina_Bool Launcher::whenChildEnds(void* launcher, int, void* event) noexcept {
+    auto* self = static_cast<Launcher*>(launcher);
+    const auto* end = static_cast<Ecore_Exe_Event_Del*>(event);
+    try {
+        self->childEnded(end->pid, end->signalled ? endBySignal(end->exit_signal) : endWithStatus(end->exit_code),
+                         end->exited && end->exit_code == 0);
+    } catch (const std::exception& failure) {
+        self->device_.log().write(Log::Level::Error, "DEVICE", failure.what());
+    }
+    return ECORE_CALLBACK_PASS_ON;
 }
 
 /// For a process whose main loop does not run.
@@ -168,7 +172,7 @@ void Launcher::childEnded(int process, const std::string& how, bool well) {
             update(child, LaunchOutcome::HandedOver, "");
         return;
     }
-    if (!child.again && std::chrono::steady_clock::now() - child.begin > startTime)
+    if (!child.again && clock_() - child.begin > startTime)
         return;
     const std::string words = lastWordsOf(device_.folder(), child.request.appId);
     update(child, LaunchOutcome::Failed, "it ended " + how + (words.empty() ? "" : "; its last words: " + words));

@@ -4,7 +4,9 @@
 #include "device/Process.h"
 
 #include <chrono>
+#include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace device {
@@ -24,7 +26,11 @@ public:
         Failed,    ///< the program cannot be started, or the manifest is broken
     };
 
-    explicit Launcher(Device& device) : device_(device) {}
+    using Clock = std::function<std::chrono::steady_clock::time_point()>;
+
+    /// `clock` tells how long a program took to fail.
+    explicit Launcher(Device& device, Clock clock = std::chrono::steady_clock::now)
+        : device_(device), clock_(std::move(clock)) {}
     ~Launcher();
     Launcher(const Launcher&) = delete;
     Launcher& operator=(const Launcher&) = delete;
@@ -54,7 +60,10 @@ private:
     void reapChildren();
     void childEnded(int process, const std::string& how, bool well);
 
+    static unsigned char whenChildEnds(void* launcher, int type, void* event) noexcept;
+
     Device& device_;
+    Clock clock_;
     std::vector<Child> children_;
     void* endHandler_ = nullptr;
 };
