@@ -20,7 +20,7 @@ public:
     /// A text is searched, looked up, marked up and copied so many times until it is translated.
     static std::uint64_t ofTranslating(std::uint64_t bytes) { return bytes * 32; }
 
-    /// Begins the next detail file, which has a share of its own: one that uses it up does not spoil the others.
+    /// Begins the next menu's files, which have a share of their own: a text that uses it up does not spoil the others.
     void beginDetail();
     /// Takes the work of handling one text: of so many bytes in all. False when there is not as much left.
     bool spendOnText(std::uint64_t bytes);
@@ -31,7 +31,8 @@ public:
     bool keepsMore() const { return keptBytes > 0; }
 
 private:
-    bool __take(std::uint64_t& left, std::uint64_t amount) const;
+    bool __take(std::uint64_t& left, std::uint64_t amount);
+    void __lookAtClock();
 
     KestProcessorTime time;
     // More than a 32-bit device can count in a size_t.
@@ -39,4 +40,6 @@ private:
     std::uint64_t detailTextBytes;
     std::uint64_t fileBytes;
     std::uint64_t keptBytes;
+    std::uint64_t workSinceLook;
+    bool isLate;
 };

@@ -117,6 +117,7 @@ bool KestContentMgr::__loadMainMenu() {
 
 bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
     KEST_BEGIN();
+    work.beginDetail();
     __loadStringResource(record);
     const std::string path = __detailPath(record);
     const int accessible = access(path.c_str(), F_OK);
@@ -129,7 +130,6 @@ bool KestContentMgr::__loadDetailMenu(KestContentInfo& record) {
         KEST_ERR("%s", document.failure());
         return false;
     }
-    work.beginDetail();
     record.menuTitle = "No Title";
     record.textContents = "No Contents";
     record.iconPath = __getIconPath(record.appid);

@@ -23,6 +23,9 @@ const size_t mostMessageBytes = 16 * 1024 * 1024;
 /// thousands of different names, each takes longer than the one before.
 const std::int64_t mostSeconds = 3;
 
+/// A file of an ordinary catalogue is parsed in less time than many looks at the clock take.
+const size_t bytesBetweenLooks = 64 * 1024;
+
 /// What reading an element or a reference costs beside its text, in bytes of text.
 const size_t costOfNode = 16;
 
@@ -37,21 +40,34 @@ struct Source {
     size_t at;
     /// As if the text ended here.
     bool isCut;
-    KestProcessorTime time;
+    size_t nextLook;
+    /// Begins at the first look.
+    std::unique_ptr<const KestProcessorTime> time;
 };
 Source* source = nullptr;
 
-int isForParser(const char*) {
+void lookAtClock(Source& from) {
+    if (!from.time) {
+        from.time.reset(new KestProcessorTime(mostSeconds));
+    }
+    from.nextLook += bytesBetweenLooks;
+    from.isCut = from.isCut || from.time->isOver();
+}
+
+int __isForParser(const char*) {
     return source ? 1 : 0;
 }
 
-void* openText(const char*) {
+void* __openText(const char*) {
     return source->at == 0 ? source : nullptr;
 }
 
-int readText(void* context, char* buffer, int length) {
+int __readText(void* context, char* buffer, int length) {
     auto* from = static_cast<Source*>(context);
-    if (from->isCut || from->time.isOver()) {
+    if (from->at >= from->nextLook) {
+        lookAtClock(*from);
+    }
+    if (from->isCut) {
         return 0;
     }
     const size_t count = from->text.copy(buffer, static_cast<size_t>(length), from->at);
@@ -59,7 +75,7 @@ int readText(void* context, char* buffer, int length) {
     return static_cast<int>(count);
 }
 
-int closeText(void*) {
+int __closeText(void*) {
     return 0;
 }
 
@@ -68,14 +84,14 @@ bool giveTextsToParser() {
     xmlInitParser();
     // Each catalog that a file names would be put at the end of a list which begins at its start.
     xmlCatalogSetDefaults(XML_CATA_ALLOW_NONE);
-    return xmlRegisterInputCallbacks(isForParser, openText, readText, closeText) >= 0;
+    return xmlRegisterInputCallbacks(__isForParser, __openText, __readText, __closeText) >= 0;
 }
 
 /// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
 class Parsing {
 public:
     explicit Parsing(const std::string& text)
-        : current{text, 0, false, KestProcessorTime(mostSeconds)}, messageBytes(0) {
+        : current{text, 0, false, bytesBetweenLooks, nullptr}, messageBytes(0) {
         static const bool given = giveTextsToParser();
         source = given ? &current : nullptr;
         xmlSetStructuredErrorFunc(this, __dropMessage);
@@ -106,21 +122,21 @@ private:
 /// for gigabytes, which the parser does not notice while it only refers to them.
 class ReferredText {
 public:
-    size_t lengthIn(const xmlDoc* document) { return lengthOf(xmlDocGetRootElement(document), false); }
+    size_t lengthIn(const xmlDoc* document) { return __lengthOf(xmlDocGetRootElement(document), false); }
 
 private:
     /// Of a node and those after it, with the text between the references or without it.
-    size_t lengthOf(const xmlNode* first, bool withPlainText) {
+    size_t __lengthOf(const xmlNode* first, bool withPlainText) {
         size_t length = 0;
         for (const xmlNode* node = first; node && length <= mostReferredText; node = node->next) {
             length += withPlainText || node->type == XML_ENTITY_REF_NODE ? costOfNode : 0;
             if (node->type == XML_ENTITY_REF_NODE) {
-                length += lengthOf(xmlGetDocEntity(node->doc, node->name));
+                length += __lengthOf(xmlGetDocEntity(node->doc, node->name));
             } else if (node->type == XML_ELEMENT_NODE) {
                 for (const xmlAttr* attribute = node->properties; attribute; attribute = attribute->next) {
-                    length += lengthOf(attribute->children, withPlainText);
+                    length += __lengthOf(attribute->children, withPlainText);
                 }
-                length += lengthOf(node->children, withPlainText);
+                length += __lengthOf(node->children, withPlainText);
             } else if (withPlainText && node->content) {
                 length += static_cast<size_t>(xmlStrlen(node->content));
             }
@@ -128,7 +144,7 @@ private:
         return length;
     }
 
-    size_t lengthOf(const xmlEntity* entity) {
+    size_t __lengthOf(const xmlEntity* entity) {
         if (!entity) {
             return 0;
         }
@@ -138,7 +154,7 @@ private:
         }
         // Stands until the real length is known, so that an entity that holds itself ends the search.
         lengths[entity] = mostReferredText + 1;
-        const size_t length = lengthOf(entity->children, true);
+        const size_t length = __lengthOf(entity->children, true);
         lengths[entity] = length;
         return length;
     }

@@ -220,6 +220,23 @@ TEST_F(HostileText, ADomainMayHaveAnyName) {
         "T");
 }
 
+TEST_F(HostileText, ADomainDoesNotLeadOutOfItsFolder) {
+    const std::string title = "<title id=\"IDS_TIPS\">untranslated</title>";
+    ASSERT_NE(loadTip("<textdomain>tips</textdomain>" + title).menuTitle, "untranslated");
+    EXPECT_EQ(loadTip("<textdomain>../LC_MESSAGES/tips</textdomain>" + title).menuTitle, "untranslated");
+}
+
+TEST_F(HostileText, ADomainHasTwoHundredBytesAtMost) {
+    const auto isBound = [this](std::size_t length) {
+        const std::string domain(length, 'd');
+        loadTip("<textdomain>" + domain + "</textdomain><title id=\"IDS_OWN\">T</title>");
+        const auto& bound = kest_texts::bindings();
+        return std::any_of(bound.begin(), bound.end(), [&](const auto& binding) { return binding.first == domain; });
+    };
+    EXPECT_TRUE(isBound(200));
+    EXPECT_FALSE(isBound(201));
+}
+
 TEST_F(HostileText, OfOneTipDoesNotSpoilAnother) {
     const std::string tag = "<text id=\"IDS_A\">" + std::string(900000, 'x') + "</text>";
     writeStrings({{"en", "IDS_A", tag}});

@@ -72,4 +72,24 @@ TEST(LoadWork, EndsAfterTenSecondsOfTheProcessorsTime) {
     processor_clock::ahead = 0;
 }
 
+/// How many texts, or files, of no length are taken once the time is over: the clock is not looked at for each.
+template <class Spend>
+int takenTooLate(Spend spend) {
+    KestLoadWork work;
+    processor_clock::ahead = 11;
+    int taken = 0;
+    while (taken < 1000 && (work.*spend)(0))
+        ++taken;
+    processor_clock::ahead = 0;
+    return taken;
+}
+
+TEST(LoadWork, OfOneDetailEndsByTheClockToo) {
+    EXPECT_LT(takenTooLate(&KestLoadWork::spendOnText), 32);
+}
+
+TEST(LoadWork, OnManyEmptyFilesEndsByTheClock) {
+    EXPECT_LT(takenTooLate(&KestLoadWork::spendOnFile), 32);
+}
+
 }  // namespace

@@ -46,6 +46,25 @@ TEST_F(ViewsAbove, AreClosedBeforeTheCatalogueIsLoadedAtAPackageChange) {
     calls::made().whenPopped = nullptr;
 }
 
+TEST_F(ViewsAbove, AreClosedBeforeTheRowsAreMadeAnewAtALanguageChange) {
+    startBeneathTwoViews();
+    calls::made().updates = 0;
+    std::vector<int> before;
+    calls::made().whenPopped = [&] { before.push_back(calls::made().updates); };
+    const auto changed = calls::made().smartCallbacks.at("language,changed");
+    newLog();
+    test_ui::inMainLoop([&] {
+        changed(const_cast<void*>(calls::made().rows.back().selectData), nullptr, nullptr);
+        EXPECT_EQ(levels(), 2U) << "at once";
+        EXPECT_THAT(newLog(),
+                    testing::Not(testing::Contains(kest_log::begin("KestContentMgr.cpp", "loadContentsList"))));
+    });
+    settle();
+    EXPECT_THAT(before, testing::ElementsAre(0));
+    EXPECT_EQ(levels(), 2U);
+    calls::made().whenPopped = nullptr;
+}
+
 TEST_F(ViewsAbove, RemainWhenTheListGoesInTheMidstOfALanguageChange) {
     writeTips({"A"});
     start();
@@ -63,5 +82,6 @@ TEST_F(ViewsAbove, RemainWhenTheListGoesInTheMidstOfALanguageChange) {
     settle();
     EXPECT_EQ(calls::made().updates, 0);
     EXPECT_THAT(newLog(), IsEmpty());
+    EXPECT_EQ(levels(), 2U) << "one was closed, and the list went";
     EXPECT_EQ(topView(), "OtherView");
 }

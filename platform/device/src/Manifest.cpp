@@ -15,6 +15,7 @@ namespace device {
 namespace {
 
 constexpr std::size_t largestManifest = 1024 * 1024;
+constexpr std::size_t readAtOnce = 16 * 1024;
 
 /// Frees a libxml2 object with its own function.
 template <auto release>
@@ -48,20 +49,17 @@ std::string contentsOf(const std::filesystem::path& file) {
     struct stat status {};
     if (fstat(descriptor.get(), &status) != 0 || !S_ISREG(status.st_mode))
         fail(file, 0, "is not a file");
-    std::string text(largestManifest + 1, '\0');
-    std::size_t length = 0;
-    while (length < text.size()) {
-        const ssize_t count = read(descriptor.get(), text.data() + length, text.size() - length);
+    std::string text;
+    char part[readAtOnce];
+    while (text.size() <= largestManifest) {
+        const ssize_t count = read(descriptor.get(), part, sizeof part);
         if (count < 0)
             fail(file, 0, "cannot be read: " + reasonOf(errno));
         if (count == 0)
-            break;
-        length += static_cast<std::size_t>(count);
+            return text;
+        text.append(part, static_cast<std::size_t>(count));
     }
-    if (length > largestManifest)
-        fail(file, 0, "is larger than 1 MiB; a manifest is not");
-    text.resize(length);
-    return text;
+    fail(file, 0, "is larger than 1 MiB; a manifest is not");
 }
 
 Document parsed(const std::filesystem::path& file) {
