@@ -2,6 +2,7 @@
 
 #include "KestPictureArea.h"
 
+#include <cstdint>
 #include <string>
 
 /// Builds a page's picture area from the path of its first picture: the placeholder, a picture that stands still, a
@@ -31,7 +32,13 @@ private:
 
     Evas_Object* __createPage(Evas_Object* parent, const std::string& picturePath);
     Evas_Object* __createVerticalPage(Evas_Object* parent, const std::string& imagePath);
+    /// The picture of a page: the variant, where there is one, else the picture itself, else the placeholder.
+    Evas_Object* __createPicture(Evas_Object* page, const std::string& variantPath, const std::string& picturePath);
+    /// Null for a file that is no picture, or one that the page has no room for.
+    Evas_Object* __createReadableImage(Evas_Object* page, const std::string& path);
+    /// An image without a file where that is no picture or too large.
     Evas_Object* __createImage(Evas_Object* parent, const std::string& path);
+    void __setFile(Evas_Object* image, const std::string& path) const;
     void __setSizer(Evas_Object* page, const Size& least) const;
     Evas_Object* __createLayout(Evas_Object* parent, const char* group) const;
     int __pageWidth() const;
@@ -39,4 +46,7 @@ private:
     KestPictureArea& area;
     Evas_Object* window;
     std::string themeFile;
+    /// How many pixels the pictures and markers of the page may still have: they are decoded, four bytes each, for as
+    /// long as the page is there.
+    std::int64_t pixelsLeft;
 };

@@ -3,6 +3,7 @@
 #include "KestCommon.h"
 #include "KestLog.h"
 #include "KestPaths.h"
+#include "KestPictureFile.h"
 #include "KestPicturePaths.h"
 #include "KestPlatformString.h"
 #include "KestSizeHints.h"
@@ -18,7 +19,7 @@ const char placeholderFile[] = "contents/contents_not_released.png";
 const char videoPart[] = "video";
 
 /// The area in the picture's own measures.
-const double areaWidth = 716.0;
+const int areaWidth = 716;
 const int areaHeight = 655;
 
 const double marginInUnits = 4.0;
@@ -29,6 +30,12 @@ const int lowDensityCut = 138;
 
 /// A picture that has more is left out: decoded, it takes four bytes each.
 const std::int64_t mostPixels = 4 * 1024 * 1024;
+/// Room for as many pictures as a sequence can have, each with a marker.
+const std::int64_t mostPixelsOfPage = std::int64_t{2} * KestPictureArea::mostPages * areaWidth * areaHeight;
+
+std::string placeholderPath() {
+    return KestCommon::getSharedResourcePath(KEST_APP_ID) + placeholderFile;
+}
 
 /// Nothing where the object could not be made.
 void put(Evas_Object* layout, const char* part, Evas_Object* object) {
@@ -55,10 +62,11 @@ bool isLowDensity() {
 }  // namespace
 
 KestPictureBuilder::KestPictureBuilder(KestPictureArea& pictureArea, Evas_Object* viewWindow)
-    : area(pictureArea), window(viewWindow), themeFile(KestCommon::getEdjFilePath(true)) {}
+    : area(pictureArea), window(viewWindow), themeFile(KestCommon::getEdjFilePath(true)), pixelsLeft(0) {}
 
 void KestPictureBuilder::build(Evas_Object* pageLayout, const std::string& imagePath) {
     area.pageCount = 0;
+    pixelsLeft = mostPixelsOfPage;
     if (!KestPicturePaths::isAccessible(imagePath)) {
         __buildPlaceholder(pageLayout);
         return;
@@ -73,8 +81,7 @@ void KestPictureBuilder::build(Evas_Object* pageLayout, const std::string& image
 }
 
 void KestPictureBuilder::__buildPlaceholder(Evas_Object* pageLayout) {
-    put(pageLayout, videoPart,
-        __createImage(pageLayout, KestCommon::getSharedResourcePath(KEST_APP_ID) + placeholderFile));
+    put(pageLayout, videoPart, __createImage(pageLayout, placeholderPath()));
 }
 
 void KestPictureBuilder::__buildSingle(Evas_Object* pageLayout, const std::string& imagePath) {
@@ -163,7 +170,7 @@ void KestPictureBuilder::__packPage(Evas_Object* box, Evas_Object* page) {
 Evas_Object* KestPictureBuilder::__createPage(Evas_Object* parent, const std::string& picturePath) {
     KEST_HIT();
     Size size = {__pageWidth(), 0};
-    size.height = static_cast<int>(size.width / areaWidth * areaHeight);
+    size.height = static_cast<int>(size.width / static_cast<double>(areaWidth) * areaHeight);
     const bool isNarrow = size.width <= leastWidthOfPage;
     if (isNarrow) {
         size.height = heightOfNarrowPage;
@@ -178,9 +185,9 @@ Evas_Object* KestPictureBuilder::__createPage(Evas_Object* parent, const std::st
     KEST_INFO("imagePath_touch = %s", touchPath.c_str());
     KEST_INFO("imagePath_russia = %s", russianPath.c_str());
     const bool takesRussian = isRussian() && KestPicturePaths::isAccessible(russianPath);
-    put(page, "page", __createImage(page, takesRussian ? russianPath : picturePath));
+    put(page, "page", __createPicture(page, takesRussian ? russianPath : "", picturePath));
     if (KestPicturePaths::isAccessible(touchPath)) {
-        put(page, "page.touch", __createImage(page, touchPath));
+        put(page, "page.touch", __createReadableImage(page, touchPath));
     }
     __setSizer(page, size);
     area.addPage(page, picturePath);
@@ -212,11 +219,51 @@ Evas_Object* KestPictureBuilder::__createVerticalPage(Evas_Object* parent, const
     return page;
 }
 
+Evas_Object* KestPictureBuilder::__createPicture(Evas_Object* page, const std::string& variantPath,
+                                                 const std::string& picturePath) {
+    Evas_Object* image = variantPath.empty() ? nullptr : __createReadableImage(page, variantPath);
+    if (!image) {
+        image = __createReadableImage(page, picturePath);
+    }
+    return image ? image : __createImage(page, placeholderPath());
+}
+
+Evas_Object* KestPictureBuilder::__createReadableImage(Evas_Object* page, const std::string& path) {
+    Evas_Object* image = __createImage(page, path);
+    int width = 0;
+    int height = 0;
+    if (image) {
+        elm_image_object_size_get(image, &width, &height);
+    }
+    const std::int64_t pixels = std::int64_t{width} * height;
+    if (pixels > 0 && pixels <= pixelsLeft) {
+        pixelsLeft -= pixels;
+        return image;
+    }
+    if (pixels > 0) {
+        KEST_WARN("%d x %d pixels are more than the page has left: %s", width, height, path.c_str());
+    } else {
+        KEST_WARN("no picture: %s", path.c_str());
+    }
+    evas_object_del(image);
+    return nullptr;
+}
+
 Evas_Object* KestPictureBuilder::__createImage(Evas_Object* parent, const std::string& path) {
     Evas_Object* image = elm_image_add(parent);
     KEST_INFO("imagePath : %s", path.c_str());
     if (!image) {
         return nullptr;
+    }
+    __setFile(image, path);
+    KestSizeHints::fill(image);
+    return image;
+}
+
+void KestPictureBuilder::__setFile(Evas_Object* image, const std::string& path) const {
+    if (!KestPictureFile::isWhole(path)) {
+        KEST_WARN("the file breaks off: %s", path.c_str());
+        return;
     }
     elm_image_file_set(image, path.c_str(), nullptr);
     int width = 0;
@@ -226,8 +273,6 @@ Evas_Object* KestPictureBuilder::__createImage(Evas_Object* parent, const std::s
         KEST_WARN("%d x %d pixels are too many: %s", width, height, path.c_str());
         elm_image_file_set(image, nullptr, nullptr);
     }
-    KestSizeHints::fill(image);
-    return image;
 }
 
 void KestPictureBuilder::__setSizer(Evas_Object* page, const Size& least) const {

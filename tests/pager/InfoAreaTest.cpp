@@ -47,6 +47,17 @@ TEST_F(InfoArea, IsToRead) {
     EXPECT_TRUE(evas_object_visible_get(info()));
 }
 
+TEST_F(InfoArea, IsFilledByItsText) {
+    openTip(tip("a_01.png"));
+    for (const Evas_Object* object : {entry(), infoLayout()}) {
+        double across = 0, down = 0;
+        evas_object_size_hint_align_get(object, &across, &down);
+        EXPECT_EQ(std::pair(across, down), std::pair(EVAS_HINT_FILL, EVAS_HINT_FILL));
+        evas_object_size_hint_weight_get(object, &across, &down);
+        EXPECT_EQ(std::pair(across, down), std::pair(EVAS_HINT_EXPAND, EVAS_HINT_EXPAND));
+    }
+}
+
 TEST_F(InfoArea, ScrollsUpAndDownAsAWhole) {
     openTip(tip("a_01.png"));
     EXPECT_STREQ(elm_object_style_get(info()), "effect");

@@ -1,9 +1,49 @@
+// Telling a group of objects from a single one takes a call that EFL still marks as beta.
+#define EFL_BETA_API_SUPPORT
+
 #include "PictureTest.h"
+
+#include <Eo.h>
 
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-using PictureArea = PictureTest;
+class PictureArea : public PictureTest {
+protected:
+    /// How many images of a page have that file, in sight or not.
+    int imagesOf(const std::string& file) {
+        int count = 0;
+        for (Evas_Object* object = evas_object_bottom_get(screen().canvas()); object;
+             object = evas_object_above_get(object))
+            count += imagesOf(file, object);
+        return count;
+    }
+    static void expectExpands(const Evas_Object* object) {
+        double across = 0, down = 0;
+        evas_object_size_hint_weight_get(object, &across, &down);
+        EXPECT_EQ(std::pair(across, down), std::pair(EVAS_HINT_EXPAND, EVAS_HINT_EXPAND));
+    }
+    static void expectFills(const Evas_Object* object) {
+        double across = 0, down = 0;
+        evas_object_size_hint_align_get(object, &across, &down);
+        EXPECT_EQ(std::pair(across, down), std::pair(EVAS_HINT_FILL, EVAS_HINT_FILL));
+        expectExpands(object);
+    }
+
+private:
+    static int imagesOf(const std::string& file, Evas_Object* object) {
+        if (elm_object_widget_check(object) && typeOf(object) == "Elm_Image")
+            return fileOf(object) == file ? 1 : 0;
+        if (!efl_isa(object, EFL_CANVAS_GROUP_CLASS))
+            return 0;
+        int count = 0;
+        Eina_List* members = evas_object_smart_members_get(object);
+        void* member = nullptr;
+        EINA_LIST_FREE(members, member)
+        count += imagesOf(file, static_cast<Evas_Object*>(member));
+        return count;
+    }
+};
 
 TEST_F(PictureArea, OfOnePictureIsItsPage) {
     const std::string picture = drawPicture("a_01.png");
@@ -22,6 +62,45 @@ TEST_F(PictureArea, ShowsThePicture) {
     const test_ui::Point middle = test_ui::geometry(video()).middle();
     // A thread reads the file in its own time.
     EXPECT_TRUE(test_ui::runUntil([&] { return screen().picture().pixel(middle.x, middle.y) == 0xAA3300U; }, 600));
+}
+
+TEST_F(PictureArea, HasAPictureOnce) {
+    const std::string picture = drawPicture("a_01.png");
+    openPage();
+    EXPECT_EQ(imagesOf(picture), 1);
+}
+
+TEST_F(PictureArea, HasATallPictureOnce) {
+    const std::string picture = drawPicture("a_01.png", 716, 900);
+    openPage();
+    EXPECT_EQ(imagesOf(picture), 1);
+}
+
+TEST_F(PictureArea, IsFilledByItsPicture) {
+    drawSequence(2, {0});
+    openPage();
+    expectExpands(video());
+    for (Evas_Object* picture : pictures()) {
+        expectExpands(picture);
+        expectFills(elm_object_part_content_get(picture, "page"));
+        expectExpands(elm_object_part_content_get(picture, "sizer"));
+    }
+    expectFills(elm_object_part_content_get(pictures()[0], "page.touch"));
+}
+
+TEST_F(PictureArea, IsFilledByATallPicture) {
+    drawPicture("a_01.png", 716, 900);
+    openPage();
+    Evas_Object* tall = elm_object_content_get(pictureScroller());
+    expectExpands(video());
+    expectExpands(tall);
+    expectFills(elm_object_part_content_get(tall, "page"));
+    expectExpands(elm_object_part_content_get(tall, "sizer"));
+}
+
+TEST_F(PictureArea, IsFilledByThePlaceholder) {
+    openPage("missing.png");
+    expectFills(video());
 }
 
 TEST_F(PictureArea, OfOnePictureIsToldOfInTheLog) {
@@ -129,9 +208,33 @@ TEST_F(PictureArea, OfASequenceIsPagedByNoFinger) {
     elm_scroller_policy_get(scroller, &horizontalBar, &verticalBar);
     EXPECT_EQ(horizontalBar, ELM_SCROLLER_POLICY_OFF);
     EXPECT_EQ(verticalBar, ELM_SCROLLER_POLICY_OFF);
+    Eina_Bool horizontalBounce = EINA_TRUE, verticalBounce = EINA_TRUE;
+    elm_scroller_bounce_get(scroller, &horizontalBounce, &verticalBounce);
+    EXPECT_FALSE(horizontalBounce || verticalBounce);
     int limit = 0;
     elm_scroller_page_scroll_limit_get(scroller, &limit, nullptr);
     EXPECT_EQ(limit, 1);
+}
+
+TEST_F(PictureArea, OfASequenceStaysWhereItIsBelowAFingerThatMovesUpOrDown) {
+    drawSequence(2);
+    openPage();
+    test_ui::runFor(0.5);
+    const test_ui::Point middle = test_ui::geometry(video()).middle();
+    const test_ui::Rect before = test_ui::geometry(pictures()[0]);
+    for (const int way : {200, -200}) {
+        calls::forget();
+        screen().press(middle);
+        for (int step = 1; step <= 10; ++step) {
+            screen().moveTo({middle.x, middle.y + way * step / 10});
+            test_ui::runFor(0.02);
+            EXPECT_EQ(test_ui::geometry(pictures()[0]), before);
+        }
+        screen().lift();
+        test_ui::runFor(0.2);
+        EXPECT_EQ(test_ui::geometry(pictures()[0]), before);
+        EXPECT_THAT(calls::story(), IsEmpty());
+    }
 }
 
 TEST_F(PictureArea, EndsASequenceBeforeTheFirstMissingPicture) {

@@ -1,5 +1,8 @@
 #include "PictureTest.h"
 
+#include <fstream>
+#include <unistd.h>
+
 std::string PictureTest::groupOf(Evas_Object* layout) {
     const char* group = nullptr;
     elm_layout_file_get(layout, nullptr, &group);
@@ -23,4 +26,11 @@ PictureTest::Size PictureTest::sizeOf(Evas_Object* layout) {
     Size size{};
     evas_object_size_hint_min_get(elm_object_part_content_get(layout, "sizer"), &size.width, &size.height);
     return size;
+}
+
+std::size_t PictureTest::memory() {
+    std::ifstream stream("/proc/self/statm");
+    std::size_t whole = 0, resident = 0;
+    stream >> whole >> resident;
+    return resident * static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
 }

@@ -31,6 +31,9 @@ protected:
     /// How large the sizer has a picture be at least.
     static Size sizeOf(Evas_Object* layout);
 
+    /// Bytes of this process in memory.
+    static std::size_t memory();
+
     bool showsPlaceholder() { return typeOf(video()) == "Elm_Image" && fileOf(video()) == placeholder(); }
     std::string placeholder() const { return (resources() / "contents/contents_not_released.png").string(); }
 
