@@ -27,7 +27,7 @@ protected:
     std::vector<std::string> remains() const {
         std::vector<std::string> names;
         for (const auto& entry : std::filesystem::directory_iterator(device.root() / "opt/usr/apps"))
-            if (entry.path().filename().string().rfind(".installing-", 0) == 0)
+            if (entry.is_directory() && entry.path().filename().string().starts_with('.'))
                 names.push_back(entry.path().filename().string());
         return names;
     }

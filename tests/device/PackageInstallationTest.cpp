@@ -19,6 +19,7 @@ namespace {
 using device::PackageEvent;
 using support::messageOf;
 using support::Process;
+using support::readFile;
 using support::TemporaryDevice;
 using support::writeFile;
 using testing::AllOf;
@@ -179,24 +180,6 @@ TEST_F(RefusedPackages, DoNotFitOnTheDisk) {
     EXPECT_THAT(remains(), IsEmpty());
 }
 
-TEST_F(PackageInstallation, ThatCannotBeNotedDownAreNotInstalled) {
-    device->database().sql().exec(
-        "CREATE TRIGGER refuse BEFORE INSERT ON package BEGIN SELECT RAISE(ABORT, 'no'); END");
-    EXPECT_EQ(messageOf([&] { packages.install(makePackage("com.example.tea")); }),
-              device.root().string() + "/device.db: cannot be used (no)");
-    EXPECT_FALSE(std::filesystem::exists(device.root() / "opt/usr/apps/com.example.tea"));
-    EXPECT_THAT(remains(), IsEmpty());
-    device->database().sql().exec("DROP TRIGGER refuse");
-
-    packages.install(makePackage("com.example.tea", "1.0"));
-    device->database().sql().exec(
-        "CREATE TRIGGER refuse BEFORE UPDATE ON package BEGIN SELECT RAISE(ABORT, 'no'); END");
-    EXPECT_EQ(messageOf([&] { packages.install(makePackage("com.example.tea", "2.0")); }),
-              device.root().string() + "/device.db: cannot be used (no)");
-    EXPECT_EQ(packages.find("com.example.tea")->version, "1.0");
-    EXPECT_THAT(remains(), IsEmpty());
-}
-
 TEST_F(PackageInstallation, AreWholeAfterAnInstallationIsKilledAtAnyMoment) {
     const auto versions = {makePackage("com.example.tea", "1.0"), makePackage("com.example.tea", "2.0")};
     for (const auto& source : versions)
@@ -225,11 +208,52 @@ TEST_F(PackageInstallation, AreWholeAfterAnInstallationIsKilledAtAnyMoment) {
     EXPECT_THAT(remains(), IsEmpty());
 }
 
-TEST_F(PackageInstallation, ThatAnUnfinishedRemovalLeftAreCleanedByTheNextInstallation) {
-    const auto left = TemporaryDevice::makePackage(device.root() / "opt/usr/apps/com.example.left", "com.example.left");
+TEST_F(PackageInstallation, NeedsNoNoteInTheDatabase) {
+    packages.uninstall("com.example.app");
+    for (const char* change : {"INSERT", "UPDATE", "DELETE"})
+        device->database().sql().exec(std::string("CREATE TRIGGER refuse_") + change + " BEFORE " + change +
+                                      " ON package BEGIN SELECT RAISE(ABORT, 'no'); END");
+    for (const char* version : {"1.0", "2.0"})
+        for (const char* id : {"com.example.tea", "com.example.app"})
+            EXPECT_EQ(packages.install(makePackage(id, version)).version, version);
+    EXPECT_THAT(remains(), IsEmpty());
+}
+
+TEST_F(PackageInstallation, CleansWhatOthersThatWereCutShortHaveLeft) {
+    const auto apps = device.root() / "opt/usr/apps";
+    TemporaryDevice::makePackage(apps / ".installing-abcdef", "com.example.left");
+    TemporaryDevice::makePackage(apps / ".removing-abcdef/com.example.left", "com.example.left");
     EXPECT_FALSE(packages.find("com.example.left"));
     packages.install(makePackage("com.example.tea"));
-    EXPECT_FALSE(std::filesystem::exists(left));
+    EXPECT_THAT(remains(), IsEmpty());
+}
+
+TEST_F(PackageInstallation, LeavesEveryOtherFolder) {
+    const auto apps = device.root() / "opt/usr/apps";
+    writeFile(apps / "notes/mine.txt", "mine");
+    TemporaryDevice::makePackage(apps / "com.example.hand", "com.example.hand", "0.1");
+    packages.install(makePackage("com.example.tea"));
+    EXPECT_EQ(readFile(apps / "notes/mine.txt"), "mine");
+    EXPECT_THAT(idsOf(packages.all()), ElementsAre("com.example.app", "com.example.hand", "com.example.tea"));
+}
+
+TEST_F(PackageInstallation, KeepsWhatWasInstalledBeforeTheDatabaseWasDamaged) {
+    const auto tea = makePackage("com.example.tea", "2.0");
+    writeFile(tea / "shared/res/tip.xml", "<tip/>");
+    packages.install(tea);
+    packages.install(makePackage("com.example.app", "4.0"));
+    device::Device::setCurrent(nullptr);
+    writeFile(device.options().folder.database(), std::string(10000, 'x'));
+    ASSERT_THROW(device.reopen(), device::DamagedError);
+    device.reopen();
+
+    EXPECT_THAT(idsOf(device->packages().all()), ElementsAre("com.example.app", "com.example.tea"));
+    device->packages().install(makePackage("com.example.other"));
+    EXPECT_THAT(idsOf(device->packages().all()),
+                ElementsAre("com.example.app", "com.example.other", "com.example.tea"));
+    EXPECT_EQ(device->packages().find("com.example.app")->version, "4.0");
+    EXPECT_EQ(device->packages().find("com.example.tea")->version, "2.0");
+    EXPECT_EQ(readFile(device.root() / "opt/usr/apps/com.example.tea/shared/res/tip.xml"), "<tip/>");
 }
 
 TEST_F(PackageInstallation, MayBeInstalledByTwoProcessesAtOnce) {

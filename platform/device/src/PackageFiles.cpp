@@ -96,11 +96,16 @@ void replaceFolder(const std::filesystem::path& fresh, const std::filesystem::pa
         return;
     const int reason = errno;
     const std::filesystem::path old = fresh.string() + "-old";
+    std::error_code ignored;
     const bool canExchange = reason != EINVAL && reason != ENOSYS && reason != EXDEV;
     if (canExchange || std::rename(target.c_str(), old.c_str()) != 0)
         fail(target, "cannot be replaced", reason);
-    if (std::rename(fresh.c_str(), target.c_str()) != 0 || std::rename(old.c_str(), fresh.c_str()) != 0)
-        fail(target, "cannot be replaced", errno);
+    if (std::rename(fresh.c_str(), target.c_str()) != 0) {
+        const int why = errno;
+        std::filesystem::rename(old, target, ignored);
+        fail(target, "cannot be replaced", why);
+    }
+    std::filesystem::rename(old, fresh, ignored);
 }
 
 std::filesystem::path makeTemporaryFolder(const std::filesystem::path& parent, const std::string& prefix) {

@@ -17,7 +17,8 @@
 namespace device {
 namespace {
 
-constexpr char temporaryPrefix[] = ".installing-";
+constexpr char installationPrefix[] = ".installing-";
+constexpr char removalPrefix[] = ".removing-";
 constexpr char lockName[] = ".lock";
 
 /// A folder that goes with everything in it.
@@ -70,32 +71,33 @@ std::set<std::string> foldersIn(const std::filesystem::path& parent) {
     return names;
 }
 
-std::optional<std::string> stateOf(Database& database, const std::string& id) {
-    return database.guarded([&]() -> std::optional<std::string> {
-        const auto row = database.query("SELECT state FROM package WHERE id = ?", id);
-        if (!row->executeStep())
-            return std::nullopt;
-        return row->getColumn(0).getString();
-    });
+bool isRemoved(Database& database, const std::string& id) {
+    return database.guarded(
+        [&] { return database.query("SELECT 1 FROM package WHERE id = ? AND state = 'removed'", id)->executeStep(); });
 }
 
-void setState(Database& database, const std::string& id, const std::string& state) {
+void noteRemoval(Database& database, const std::string& id) {
     database.guarded([&] {
         database
-            .query("INSERT INTO package (id, state) VALUES (?, ?) ON CONFLICT DO UPDATE SET state = excluded.state", id,
-                   state)
+            .query("INSERT INTO package (id, state) VALUES (?, 'removed') "
+                   "ON CONFLICT DO UPDATE SET state = excluded.state",
+                   id)
             ->exec();
     });
 }
 
-void forgetState(Database& database, const std::string& id) {
-    database.guarded([&] { database.query("DELETE FROM package WHERE id = ?", id)->exec(); });
+/// Moves it to `where`. Throws Error when that fails; what is not there needs no moving.
+void moveAway(const std::filesystem::path& folder, const std::filesystem::path& where) {
+    std::error_code error;
+    std::filesystem::rename(folder, where, error);
+    if (error && error != std::errc::no_such_file_or_directory)
+        throw Error(folder.string() + ": cannot be removed: " + error.message() + "; move it away by hand");
 }
 
 /// What an installation or a removal that was cut short has left.
-void removeRemains(Database& database, const std::filesystem::path& apps) {
+void removeRemains(const std::filesystem::path& apps) {
     for (const std::string& name : foldersIn(apps))
-        if (name.rfind(temporaryPrefix, 0) == 0 || stateOf(database, name) != "installed")
+        if (name.starts_with(installationPrefix) || name.starts_with(removalPrefix))
             Scratch(apps / name);
 }
 
@@ -112,11 +114,15 @@ std::optional<std::filesystem::path> Packages::rootOf(const std::string& id) con
     if (!BusName::isValid(id))
         return std::nullopt;
     std::error_code error;
-    const std::optional<std::string> state = stateOf(database_, id);
-    if (state == "removed")
-        return std::nullopt;
-    if (state == "installed" && std::filesystem::is_directory(folder_.apps() / id, error))
+    if (std::filesystem::is_directory(folder_.apps() / id, error))
         return folder_.apps() / id;
+    if (isRemoved(database_, id))
+        return std::nullopt;
+    return shippedRootOf(id);
+}
+
+std::optional<std::filesystem::path> Packages::shippedRootOf(const std::string& id) const {
+    std::error_code error;
     for (const std::filesystem::path& folder : preinstalled_)
         if (std::filesystem::is_directory(folder / id, error))
             return folder / id;
@@ -173,31 +179,15 @@ Package Packages::install(const std::filesystem::path& source) {
 void Packages::place(const std::filesystem::path& from, const std::string& id, PackageEvent event) {
     makeAppsFolder(folder_.apps());
     const FileLock lock(folder_.apps() / lockName);
-    removeRemains(database_, folder_.apps());
-    const Scratch fresh(makeTemporaryFolder(folder_.apps(), temporaryPrefix));
+    removeRemains(folder_.apps());
+    const Scratch fresh(makeTemporaryFolder(folder_.apps(), installationPrefix));
     copyPackage(from, fresh.path());
     if (readManifest(fresh.path()).id != id)
         throw Error(from.string() + ": changed while it was copied; install it again");
     event.state = PackageEvent::State::Processing;
     event.progress = 50;
     events_.publishPackage(event);
-    commit(fresh.path(), id);
-}
-
-void Packages::commit(const std::filesystem::path& fresh, const std::string& id) {
-    const std::filesystem::path target = folder_.apps() / id;
-    replaceFolder(fresh, target);
-    try {
-        setState(database_, id, "installed");
-    } catch (const Error&) {
-        // Nothing may have changed: put back what stood there, or take the new folder away again.
-        std::error_code ignored;
-        if (std::filesystem::exists(fresh, ignored))
-            replaceFolder(fresh, target);
-        else
-            std::filesystem::rename(target, fresh, ignored);
-        throw;
-    }
+    replaceFolder(fresh.path(), folder_.apps() / id);
 }
 
 void Packages::uninstall(const std::string& id) {
@@ -220,15 +210,12 @@ void Packages::remove(const std::string& id, PackageEvent event) {
     event.state = PackageEvent::State::Processing;
     event.progress = 50;
     events_.publishPackage(event);
-    std::error_code error;
-    const bool shipped = std::any_of(preinstalled_.begin(), preinstalled_.end(), [&](const auto& folder) {
-        return std::filesystem::is_directory(folder / id, error);
-    });
-    if (shipped)
-        setState(database_, id, "removed");
-    else
-        forgetState(database_, id);
-    Scratch(folder_.apps() / id);
+    const Scratch removed(makeTemporaryFolder(folder_.apps(), removalPrefix));
+    // As long as the folder stands, this note counts for nothing. Written after the folder has gone, it would let the
+    // package that the folder covered come up in between.
+    if (shippedRootOf(id))
+        noteRemoval(database_, id);
+    moveAway(folder_.apps() / id, removed.path() / id);
 }
 
 void Packages::publishCompletion(PackageEvent event) {

@@ -31,7 +31,9 @@ struct Package {
 Package readManifest(const std::filesystem::path& root);
 
 /// The packages of the device: those that the build ships, read where they lie, as changed by what was
-/// installed and removed on this device. Of what was read it keeps only manifests, until their files change.
+/// installed and removed on this device. Installed is what has its folder there, whatever the database says or has
+/// lost; the database tells which of the build's packages were removed.
+/// Of what was read it keeps only manifests, until their files change.
 /// All throw Error when the database fails.
 class Packages {
 public:
@@ -52,13 +54,13 @@ public:
     /// else than files and folders, when it and the device's folder lie in each other, or when the copy fails.
     Package install(const std::filesystem::path& source);
     /// Removes the package from the device, also one that the build ships (which stays where it lies).
-    /// Publishes as install() does. Throws Error when it is not installed.
+    /// Publishes as install() does. Throws Error when it is not installed, or cannot be removed and stays.
     void uninstall(const std::string& id);
 
 private:
+    std::optional<std::filesystem::path> shippedRootOf(const std::string& id) const;
     Package read(const std::string& id, const std::filesystem::path& root) const;
     void place(const std::filesystem::path& from, const std::string& id, PackageEvent event);
-    void commit(const std::filesystem::path& fresh, const std::string& id);
     void remove(const std::string& id, PackageEvent event);
     void publishCompletion(PackageEvent event);
     void publishFailure(PackageEvent event);
