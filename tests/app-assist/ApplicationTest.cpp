@@ -42,6 +42,16 @@ TEST_F(Application, LivesInOrder) {
     EXPECT_THAT(app_.story, ElementsAre("onPause", "onTerminate"));
 }
 
+TEST_F(Application, UsesTheFreshDatabaseWhereItsOwnWasSetAsideBeforeItTookItsLock) {
+    const std::filesystem::path file = device_->database().file();
+    std::filesystem::rename(file, file.string() + ".damaged");
+    RunningApp running(app_);
+    EXPECT_EQ(std::nullopt, running.status());
+    set("db/example/word", "tea");
+    EXPECT_FALSE(device_->database().isReplaced());
+    EXPECT_EQ("tea", device::Device(device_.options()).settings().get("db/example/word"));
+}
+
 TEST_F(Application, IsToldWhenItsWindowIsPutAwayAndComesBack) {
     app_.inCreate = [this] { app_.attachWindow(new app_assist::WWindow("Sample", ELM_WIN_BASIC)); };
     RunningApp running(app_);

@@ -1,10 +1,11 @@
 #include "device/ApplicationLock.h"
 
+#include "HeldApplicationLock.h"
 #include "device/Folder.h"
 #include "support/Message.h"
-#include "support/Process.h"
 #include "support/TemporaryFolder.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
@@ -16,43 +17,6 @@ using support::messageOf;
 
 constexpr char app[] = "com.example.app";
 
-/// A lock that another process holds while this lives.
-class HeldElsewhere {
-public:
-    explicit HeldElsewhere(const Folder& folder)
-        : process_(support::Process::ofWork([&] {
-              const ApplicationLock lock(folder, app);
-              [[maybe_unused]] const auto written = write(pipe_.writing, "!", 1);
-              pause();
-              return 0;
-          })) {
-        char byte = 0;
-        [[maybe_unused]] const auto got = read(pipe_.reading, &byte, 1);
-    }
-    pid_t process() const { return process_.id(); }
-
-private:
-    struct Pipe {
-        Pipe() {
-            int ends[2];
-            if (pipe(ends) != 0)
-                throw std::runtime_error("no pipe");
-            reading = ends[0];
-            writing = ends[1];
-        }
-        ~Pipe() {
-            close(reading);
-            close(writing);
-        }
-        Pipe(const Pipe&) = delete;
-        Pipe& operator=(const Pipe&) = delete;
-        int reading;
-        int writing;
-    };
-    Pipe pipe_;
-    support::Process process_;
-};
-
 class ApplicationLockTest : public testing::Test {
 protected:
     support::TemporaryFolder place_;
@@ -63,7 +27,7 @@ protected:
 
 TEST_F(ApplicationLockTest, IsTakenByTheFirstProcess) {
     EXPECT_TRUE(ApplicationLock(folder_, app).isHeld());
-    const HeldElsewhere first(folder_);
+    const HeldApplicationLock first(folder_, app);
     EXPECT_FALSE(ApplicationLock(folder_, app).isHeld());
     EXPECT_TRUE(ApplicationLock(folder_, "com.example.other").isHeld());
 }
@@ -71,7 +35,7 @@ TEST_F(ApplicationLockTest, IsTakenByTheFirstProcess) {
 TEST_F(ApplicationLockTest, TellsWhoHasItUntilThatHasEnded) {
     EXPECT_EQ(ApplicationLock::holder(folder_, app), std::nullopt);
     {
-        const HeldElsewhere first(folder_);
+        const HeldApplicationLock first(folder_, app);
         EXPECT_EQ(ApplicationLock::holder(folder_, app), first.process());
         EXPECT_EQ(ApplicationLock::holder(folder_, "com.example.other"), std::nullopt);
     }
@@ -87,4 +51,15 @@ TEST_F(ApplicationLockTest, NeedsAFolderThatCanBeWritten) {
     const Folder nowhere(place_.path() / "none");
     EXPECT_EQ(messageOf([&] { ApplicationLock(nowhere, app); }),
               nowhere.applicationLock(app).string() + ": No such file or directory; make the device's folder writable");
+}
+
+TEST_F(ApplicationLockTest, TellsWhichApplicationsHaveRun) {
+    EXPECT_THAT(ApplicationLock::applications(folder_), testing::IsEmpty());
+    for (const char* id : {"com.example.two", app, "com.example.one"})
+        const ApplicationLock lock(folder_, id);
+    for (const char* name : {"device.db.lock", "device.db", ".lock", "other.lock", "com.example.app.log"})
+        support::writeFile(place_.path() / name, "");
+    EXPECT_THAT(ApplicationLock::applications(folder_),
+                testing::ElementsAre(app, "com.example.one", "com.example.two"));
+    EXPECT_THAT(ApplicationLock::applications(Folder(place_.path() / "none")), testing::IsEmpty());
 }

@@ -1,11 +1,13 @@
 #include "Applications.h"
 
+#include "Foreground.h"
 #include "device/ApplicationLock.h"
 #include "device/BusName.h"
 #include "device/Error.h"
 
 #include <algorithm>
-#include <set>
+#include <chrono>
+#include <thread>
 
 namespace tool {
 
@@ -14,6 +16,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto patience = 3s;
+constexpr auto pollInterval = 50ms;
 
 /// Which device the application belongs to; empty when it does not answer.
 std::string folderOf(const device::Bus& bus, const std::string& id) {
@@ -25,27 +28,15 @@ std::string folderOf(const device::Bus& bus, const std::string& id) {
     }
 }
 
-/// Ids that may run: of what is installed, and of what is not any more but has left its preferences.
-std::set<std::string> knownIds(device::Device& device) {
-    std::set<std::string> ids;
-    for (const device::Package& package : device.packages().all()) {
-        ids.insert(package.id);
-    }
-    for (const std::string& id : device.preferences().applications()) {
-        ids.insert(id);
-    }
-    return ids;
-}
-
 /// Those that answer on the bus and belong to this device.
-void addThoseOnBus(Session& session, const std::set<std::string>& known, std::vector<RunningApplication>& running) {
-    const device::Bus* bus = session.bus();
+void addThoseOnBus(Session& session, const std::vector<std::string>& known, std::vector<RunningApplication>& running) {
+    const device::Bus* bus = known.empty() ? nullptr : session.bus();
     if (!bus) {
         return;
     }
     const std::string ours = session.folder().root();
     for (const std::string& name : device::BusName::all(*bus)) {
-        if (!known.contains(name) || folderOf(*bus, name) != ours) {
+        if (std::find(known.begin(), known.end(), name) == known.end() || folderOf(*bus, name) != ours) {
             continue;
         }
         if (const std::optional<int> id = device::BusName::processOf(*bus, name)) {
@@ -55,7 +46,7 @@ void addThoseOnBus(Session& session, const std::set<std::string>& known, std::ve
 }
 
 /// The others: those that run without the bus, and those that hang.
-void addThoseThatDoNotAnswer(Session& session, const std::set<std::string>& known,
+void addThoseThatDoNotAnswer(Session& session, const std::vector<std::string>& known,
                              std::vector<RunningApplication>& running) {
     for (const std::string& id : known) {
         const bool answers = std::any_of(running.begin(), running.end(),
@@ -74,6 +65,22 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
                          "; end it with 'KEST_DEVICE=" + folder + " kest-device stop' first");
 }
 
+RunningApplication theOneMeant(Session& session, const std::string& id) {
+    const std::vector<RunningApplication> running = runningApplications(session);
+    if (id.empty() && running.empty()) {
+        throw device::Error("no application runs on this device; start one with 'kest-device start'");
+    }
+    if (id.empty()) {
+        return inFront(session, running);
+    }
+    const auto meant = std::find_if(running.begin(), running.end(),
+                                    [&](const RunningApplication& application) { return application.id == id; });
+    if (meant == running.end()) {
+        throw device::Error(id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
+    }
+    return *meant;
+}
+
 }  // namespace
 
 std::string nameOf(const RunningApplication& application) {
@@ -82,7 +89,7 @@ std::string nameOf(const RunningApplication& application) {
 
 std::vector<RunningApplication> runningApplications(Session& session) {
     std::vector<RunningApplication> running;
-    const std::set<std::string> known = knownIds(session.device());
+    const std::vector<std::string> known = device::ApplicationLock::applications(session.folder());
     addThoseOnBus(session, known, running);
     addThoseThatDoNotAnswer(session, known, running);
     std::stable_sort(running.begin(), running.end(), [](const auto& a, const auto& b) { return a.id < b.id; });
@@ -106,26 +113,16 @@ void requireOwnBus(Session& session, const device::Bus& bus) {
 }
 
 RunningApplication theApplication(Session& session, const std::string& id) {
-    const std::vector<RunningApplication> running = runningApplications(session);
-    std::vector<RunningApplication> meant;
-    std::copy_if(running.begin(), running.end(), std::back_inserter(meant),
-                 [&](const RunningApplication& application) { return id.empty() || application.id == id; });
-    if (meant.empty()) {
-        throw device::Error(id.empty()
-                                ? "no application runs on this device; start one with 'kest-device start'"
-                                : id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
+    RunningApplication meant = theOneMeant(session, id);
+    // One that has just been launched is in front before it can answer.
+    while (!meant.onBus && isComingUp(meant.process)) {
+        std::this_thread::sleep_for(pollInterval);
+        meant = theOneMeant(session, id);
     }
-    if (meant.size() > 1) {
-        std::string ids;
-        for (const RunningApplication& application : meant) {
-            ids += (ids.empty() ? "" : ", ") + application.id;
-        }
-        throw device::Error("several applications run on this device (" + ids + "); name one with --app");
+    if (!meant.onBus) {
+        throw device::Error(nameOf(meant) + " does not answer; end it with 'kest-device stop'");
     }
-    if (!meant.front().onBus) {
-        throw device::Error(nameOf(meant.front()) + " does not answer; end it with 'kest-device stop'");
-    }
-    return meant.front();
+    return meant;
 }
 
 device::BusCall callTo(Session& session, const std::string& id, const char* interface) {

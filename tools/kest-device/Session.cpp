@@ -1,5 +1,6 @@
 #include "Session.h"
 
+#include "device/Error.h"
 #include "device/ToolkitFiles.h"
 
 namespace tool {
@@ -15,7 +16,11 @@ device::Device& Session::device() {
     if (!device_) {
         device::Device::Options options = device::Device::Options::standard();
         options.check = device::Database::Check::Full;
-        device_ = std::make_unique<device::Device>(std::move(options));
+        try {
+            device_ = std::make_unique<device::Device>(std::move(options));
+        } catch (const device::DamagedInUseError& damaged) {
+            throw device::Error(std::string(damaged.what()) + "; 'kest-device stop' ends it");
+        }
     }
     return *device_;
 }

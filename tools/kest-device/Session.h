@@ -20,7 +20,8 @@ class Session {
 public:
     /// Throws device::Error when the environment names no usable folder.
     const device::Folder& folder();
-    /// Throws device::Error when the device cannot be opened, also when its damaged database was set aside.
+    /// Throws device::Error when the device cannot be opened, also when its damaged database was set aside, or was not
+    /// because an application runs.
     device::Device& device();
     /// Null when the device has no bus.
     device::Bus* bus();

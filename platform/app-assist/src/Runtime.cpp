@@ -60,7 +60,6 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
         return 2;
     }
     try {
-        device_ = &device::Device::current();
         if (const auto status = claimInstance())
             return status;
         requireDisplay();
@@ -130,12 +129,18 @@ std::optional<int> Runtime::joinBus() {
 }
 
 std::optional<int> Runtime::claimInstance() {
+    device_ = &device::Device::current();
     for (;;) {
         instance_.emplace(device_->folder(), device_->application().id);
-        if (instance_->isHeld())
-            return std::nullopt;
-        if (const auto status = handOver())
+        if (instance_->isHeld()) {
+            if (!device_->database().isReplaced())
+                return std::nullopt;
+            // It was set aside before the lock told that an application uses it. A device is opened without the lock.
+            instance_.reset();
+            device_ = &device::Device::reopenCurrent();
+        } else if (const auto status = handOver()) {
             return status;
+        }
     }
 }
 

@@ -32,7 +32,8 @@ private:
     void startToolkit(int argc, char** argv);
     bool createApplication(int argc, char** argv);
     std::optional<int> joinBus();
-    /// An exit status where another process is the application, which then has this one's launch request.
+    /// Opens the device as the one process that is the application. An exit status where another process is, which
+    /// then has this one's launch request.
     std::optional<int> claimInstance();
     /// The exit status of a second process; nullopt when the first has ended meanwhile.
     std::optional<int> handOver();

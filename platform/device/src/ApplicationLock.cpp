@@ -1,9 +1,11 @@
 #include "device/ApplicationLock.h"
 
 #include "Files.h"
+#include "device/BusName.h"
 #include "device/Error.h"
 #include "device/Folder.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <fcntl.h>
 
@@ -41,6 +43,18 @@ std::optional<pid_t> ApplicationLock::holder(const Folder& folder, const std::st
     if (!file || fcntl(file.get(), F_GETLK, &lock) != 0 || lock.l_type == F_UNLCK)
         return std::nullopt;
     return lock.l_pid;
+}
+
+std::vector<std::string> ApplicationLock::applications(const Folder& folder) {
+    std::vector<std::string> ids;
+    std::error_code error;
+    for (const auto& entry : std::filesystem::directory_iterator(folder.root(), error)) {
+        const std::string id = entry.path().stem();
+        if (BusName::isValid(id) && entry.path() == folder.applicationLock(id) && entry.path() != folder.databaseLock())
+            ids.push_back(id);
+    }
+    std::sort(ids.begin(), ids.end());
+    return ids;
 }
 
 }  // namespace device

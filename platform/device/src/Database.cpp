@@ -4,12 +4,15 @@
 #include "DatabaseHealth.h"
 #include "Files.h"
 #include "Schema.h"
+#include "device/ApplicationLock.h"
 #include "device/Error.h"
 #include "device/Folder.h"
 
 #include <fcntl.h>
+#include <optional>
 #include <sqlite3.h>
 #include <tuple>
+#include <utility>
 
 namespace device {
 namespace {
@@ -37,6 +40,13 @@ void makePrivate(const std::filesystem::path& file) {
     Descriptor(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0600));
 }
 
+std::optional<std::string> applicationOn(const Folder& folder) {
+    for (std::string& id : ApplicationLock::applications(folder))
+        if (ApplicationLock::holder(folder, id))
+            return std::move(id);
+    return std::nullopt;
+}
+
 }  // namespace
 
 Database::Query::~Query() {
@@ -52,8 +62,8 @@ Database::Impatience::~Impatience() {
 }
 
 Database::Database(const Folder& folder, Check check)
-    : file_(folder.database()), suspicion_(folder.databaseSuspicion()) {
-    const FileLock lock(folder.databaseLock());
+    : file_(folder.database()), lock_(folder.databaseLock()), suspicion_(folder.databaseSuspicion()) {
+    const FileLock lock(lock_);
     refuseWhatIsNoFile(file_);
     std::error_code ignored;
     const bool thorough = check == Check::Full || std::filesystem::exists(suspicion_, ignored);
@@ -74,9 +84,19 @@ Database::Database(const Folder& folder, Check check)
     }
     if (!damage.empty()) {
         sql_.reset();
+        // One that runs would go on with the file that it has open, whatever its name is by then.
+        if (const auto id = applicationOn(folder))
+            throw DamagedInUseError(file_.string() + ": is damaged (" + damage + ") while " + *id +
+                                    " runs on it; end that application, then try again");
         throw DamagedError(setAside(file_, damage));
     }
     std::filesystem::remove(suspicion_, ignored);
+}
+
+bool Database::isReplaced() const {
+    const FileLock lock(lock_);
+    int moved = 0;
+    return sqlite3_file_control(sql_->getHandle(), "main", SQLITE_FCNTL_HAS_MOVED, &moved) == SQLITE_OK && moved != 0;
 }
 
 SQLite::Statement& Database::statement(const char* text) {

@@ -17,15 +17,19 @@ std::unique_ptr<Device>& slot() {
     return device;
 }
 
-std::unique_ptr<Device> openStandard() {
-    if (const char* faults = std::getenv("DEVICE_FAULTS"))
-        faults::planFromText(faults);
+std::unique_ptr<Device> openOrReplace(const Device::Options& options) {
     try {
-        return std::make_unique<Device>(Device::Options::standard());
+        return std::make_unique<Device>(options);
     } catch (const DamagedError& damage) {
         std::fprintf(stderr, "%s\n", damage.what());
     }
-    return std::make_unique<Device>(Device::Options::standard());
+    return std::make_unique<Device>(options);
+}
+
+std::unique_ptr<Device> openStandard() {
+    if (const char* faults = std::getenv("DEVICE_FAULTS"))
+        faults::planFromText(faults);
+    return openOrReplace(Device::Options::standard());
 }
 
 Device::Options withFolder(Device::Options options) {
@@ -50,6 +54,15 @@ Device::~Device() = default;
 Device& Device::current() {
     if (!slot())
         slot() = openStandard();
+    return *slot();
+}
+
+Device& Device::reopenCurrent() {
+    const Options options = current().options_;
+    std::unique_ptr<Application> application = std::move(current().application_);
+    slot().reset();
+    slot() = openOrReplace(options);
+    slot()->application_ = std::move(application);
     return *slot();
 }
 

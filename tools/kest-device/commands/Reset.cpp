@@ -54,11 +54,11 @@ void reset(Session& session) {
     const device::Folder& folder = session.folder();
     folder.create();
     const FolderLock lock(folder);
+    requireNothingRuns(session);
     try {
-        requireNothingRuns(session);
+        session.device();
     } catch (const device::DamagedError& damaged) {
         std::cout << damaged.what() << '\n';
-        requireNothingRuns(session);
     }
     session.close();
     PrivateBus(folder).stop();

@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <sys/types.h>
+#include <vector>
 
 namespace device {
 
@@ -23,6 +24,9 @@ public:
     /// seen from here (it runs in another process namespace).
     /// Not for a process that has the lock itself, which would lose it.
     static std::optional<pid_t> holder(const Folder& folder, const std::string& appId);
+
+    /// The applications that have run on the device, in the order of their ids: those that run now are among them.
+    static std::vector<std::string> applications(const Folder& folder);
 
 private:
     Descriptor file_;

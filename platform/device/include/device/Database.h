@@ -23,8 +23,15 @@ public:
     };
 
     /// Opens the folder's database, or makes it with the values of a fresh device.
-    /// Throws Error (cannot be opened or written, disk full, made by a newer version), DamagedError (set aside).
+    /// Throws Error (cannot be opened or written, disk full, made by a newer version), DamagedError (set aside),
+    /// DamagedInUseError (not set aside: an application runs on it, which would go on with what nobody else reads).
+    /// Not for a process that has an application's lock itself.
     Database(const Folder& folder, Check check);
+
+    /// Whether it was set aside, or otherwise replaced, since it was opened: nobody reads what is written here. It
+    /// stays in its place once this has said no to a process that has an application's lock.
+    /// Throws Error when another process keeps the database's lock.
+    bool isReplaced() const;
 
     SQLite::Database& sql() { return *sql_; }
     const std::filesystem::path& file() const { return file_; }
@@ -79,6 +86,7 @@ private:
     [[noreturn]] void fail(const SQLite::Exception& failure);
 
     std::filesystem::path file_;
+    std::filesystem::path lock_;
     std::filesystem::path suspicion_;
     std::unique_ptr<SQLite::Database> sql_;
     std::map<std::string, SQLite::Statement, std::less<>> statements_;

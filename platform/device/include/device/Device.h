@@ -36,13 +36,16 @@ public:
     };
 
     /// Makes the folder and a fresh database where there is none.
-    /// Throws Error when that fails and DamagedError when a damaged database was set aside.
+    /// Throws Error when that fails, DamagedError when a damaged database was set aside, and DamagedInUseError when it
+    /// was not, because an application runs on the device.
     explicit Device(Options options);
     ~Device();
 
     /// The process's device, opened at the first call with Options::standard(). A damaged database is set aside,
     /// said on standard error, and replaced. Throws Error when the device cannot be opened.
     static Device& current();
+    /// Opens it anew, in the same folder and for the same application. Throws as current() does.
+    static Device& reopenCurrent();
     /// Puts another device in its place (nullptr: none, the next current() opens one anew). For tests and tools.
     static void setCurrent(std::unique_ptr<Device> device);
 

@@ -18,4 +18,10 @@ public:
     using Error::Error;
 };
 
+/// The device's database is damaged and stays where it is, because an application runs on it; what() names both.
+class DamagedInUseError : public Error {
+public:
+    using Error::Error;
+};
+
 }  // namespace device
