@@ -132,6 +132,7 @@ TEST_P(BackKey, WorksWhileAReadOnlyTextHasTheFocus) {
     TellingView* page = push("page");
     Evas_Object* entry = elm_entry_add(page->getEvasObj());
     elm_entry_editable_set(entry, EINA_FALSE);
+    elm_object_focus_allow_set(entry, EINA_TRUE);
     evas_object_resize(entry, 720, 200);
     evas_object_show(entry);
     screen().key("Shift_L");

@@ -1,7 +1,6 @@
 #include "app-assist/WPageSlideView.h"
 
 #include "BounceGuard.h"
-#include "DragGuard.h"
 #include "Guarded.h"
 #include "app-assist/WUiTimer.h"
 
@@ -26,7 +25,6 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
     evas_object_size_hint_weight_set(scroller_, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
     evas_object_size_hint_align_set(scroller_, EVAS_HINT_FILL, EVAS_HINT_FILL);
     BounceGuard::attach(scroller_);
-    DragGuard::attach(scroller_);
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
     evas_object_smart_callback_add(
         scroller_, "scroll,page,changed",
