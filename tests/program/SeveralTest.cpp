@@ -1,6 +1,5 @@
 #include "ProgramTest.h"
 
-using test_tool::failed;
 using testing::HasSubstr;
 using testing::Not;
 
@@ -25,13 +24,6 @@ TEST_F(Several, AreToldByTheStatus) {
     ASSERT_EQ(applications.size(), 2U);
     EXPECT_EQ(applications[0]["id"], sample);
     EXPECT_EQ(applications[1]["id"], app);
-}
-
-TEST_F(Several, LeaveItOpenWhichScreenIsMeant) {
-    for (const std::vector<std::string>& words :
-         {std::vector<std::string>{"tree"}, {"tap", "1", "1"}, {"wait-for", "text=Apple", "--timeout", "0"}})
-        EXPECT_EQ(device_.run(words), failed("several applications run on this device (com.example.sample, "
-                                             "com.ravella.kest); name one with --app"));
 }
 
 TEST_F(Several, AreDrivenByTheirNames) {

@@ -1,10 +1,13 @@
 #include "Applications.h"
 
+#include "Foreground.h"
 #include "device/ApplicationLock.h"
 #include "device/BusName.h"
 #include "device/Error.h"
 
 #include <algorithm>
+#include <chrono>
+#include <thread>
 
 namespace tool {
 
@@ -13,6 +16,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto patience = 3s;
+constexpr auto pollInterval = 50ms;
 
 /// Which device the application belongs to; empty when it does not answer.
 std::string folderOf(const device::Bus& bus, const std::string& id) {
@@ -61,6 +65,22 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
                          "; end it with 'KEST_DEVICE=" + folder + " kest-device stop' first");
 }
 
+RunningApplication theOneMeant(Session& session, const std::string& id) {
+    const std::vector<RunningApplication> running = runningApplications(session);
+    if (id.empty() && running.empty()) {
+        throw device::Error("no application runs on this device; start one with 'kest-device start'");
+    }
+    if (id.empty()) {
+        return inFront(session, running);
+    }
+    const auto meant = std::find_if(running.begin(), running.end(),
+                                    [&](const RunningApplication& application) { return application.id == id; });
+    if (meant == running.end()) {
+        throw device::Error(id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
+    }
+    return *meant;
+}
+
 }  // namespace
 
 std::string nameOf(const RunningApplication& application) {
@@ -93,26 +113,16 @@ void requireOwnBus(Session& session, const device::Bus& bus) {
 }
 
 RunningApplication theApplication(Session& session, const std::string& id) {
-    const std::vector<RunningApplication> running = runningApplications(session);
-    std::vector<RunningApplication> meant;
-    std::copy_if(running.begin(), running.end(), std::back_inserter(meant),
-                 [&](const RunningApplication& application) { return id.empty() || application.id == id; });
-    if (meant.empty()) {
-        throw device::Error(id.empty()
-                                ? "no application runs on this device; start one with 'kest-device start'"
-                                : id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
+    RunningApplication meant = theOneMeant(session, id);
+    // One that has just been launched is in front before it can answer.
+    while (!meant.onBus && isComingUp(meant.process)) {
+        std::this_thread::sleep_for(pollInterval);
+        meant = theOneMeant(session, id);
     }
-    if (meant.size() > 1) {
-        std::string ids;
-        for (const RunningApplication& application : meant) {
-            ids += (ids.empty() ? "" : ", ") + application.id;
-        }
-        throw device::Error("several applications run on this device (" + ids + "); name one with --app");
+    if (!meant.onBus) {
+        throw device::Error(nameOf(meant) + " does not answer; end it with 'kest-device stop'");
     }
-    if (!meant.front().onBus) {
-        throw device::Error(nameOf(meant.front()) + " does not answer; end it with 'kest-device stop'");
-    }
-    return meant.front();
+    return meant;
 }
 
 device::BusCall callTo(Session& session, const std::string& id, const char* interface) {

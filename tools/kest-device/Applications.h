@@ -27,8 +27,8 @@ std::vector<RunningApplication> runningApplications(Session& session);
 /// Refuses a bus that already has another device: throws device::Error that names it.
 void requireOwnBus(Session& session, const device::Bus& bus);
 
-/// The application that a command about the screen means: `id`, or the only one that runs when it is empty.
-/// Throws device::Error when that one does not run, or when several do.
+/// The application that a command about the screen means: `id`, or the one in front when it is empty. Waits a little
+/// for one that is still coming up. Throws device::Error when that one does not run or does not answer.
 RunningApplication theApplication(Session& session, const std::string& id);
 
 /// Calls one of the application's interfaces, com.ravella.device.Screen unless said otherwise.

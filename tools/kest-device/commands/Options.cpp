@@ -7,7 +7,7 @@ void addJsonOption(CLI::App& command, bool& json) {
 }
 
 void addAppOption(CLI::App& command, std::string& appId) {
-    command.add_option("--app", appId, "The application that is meant, where several run")->type_name("APPID");
+    command.add_option("--app", appId, "Not the application in front, but this one")->type_name("APPID");
 }
 
 }  // namespace tool
