@@ -18,6 +18,7 @@ public:
 
     /// Fills the page, the first time that it is called. The pager calls it when it is idle.
     void onViewPrepare();
+    bool isFilled() const { return entry != nullptr; }
     /// The page has become the one in view: writes its number into the title bar and starts its demonstration over.
     void onViewDisplay(Elm_Object_Item* naviItem);
     /// A swipe begins: ends the demonstration and puts the pictures back to their start.

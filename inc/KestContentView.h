@@ -26,15 +26,24 @@ public:
 protected:
     Evas_Object* onCreate(Evas_Object* parent, void* viewParam) override;
     void onCreated() override {}
-    void onDestroy() override {}
+    void onDestroy() override { going = true; }
     Elm_Object_Item* onPushToNaviframe(Evas_Object* naviframe) override;
     void onPushed(Elm_Object_Item* naviItem) override;
 
 private:
     void __initScroller();
-    /// Null for an index without a page, and when the pages are about to go.
-    app_assist::KestContentSubView* __pageAt(std::int32_t index) const;
+    /// Null for a menu without a page, and when the pages are about to go.
+    app_assist::KestContentSubView* __pageAt(std::int32_t menu) const;
+    /// The scroller knows the pages by their places; one that could not be made has none.
+    std::int32_t __placeOf(std::int32_t menu) const;
+    /// -1 for a place without a page.
+    std::int32_t __menuAt(std::int32_t place) const;
+    std::int32_t __menuInView() const;
+    void __appendPages();
+    void __prepareChosenPage(Elm_Object_Item* naviItem);
     void __preparePages();
+    void __prepare(std::int32_t menu);
+    void __display(std::int32_t menu, Elm_Object_Item* naviItem);
 
     static void __backCb(void* data, Evas_Object* obj, void* event_info);
     static void __pageScrollStartCb(void* data, Evas_Object* obj, void* event_info);
@@ -42,10 +51,13 @@ private:
 
     /// The page that was opened, or that a launch request chose last; a swipe leaves it alone.
     std::int32_t __selectedView;
-    /// The base deletes the pages, once they are appended.
+    /// The base deletes the pages, once they are appended. Null where a page could not be made.
     app_assist::KestContentSubView* pages[mostPages];
     std::int32_t pageCount;
     bool pushOnTop;
-    /// How many of the pages the base has taken over.
+    /// How many of the pages were handed to the base.
     std::int32_t appended;
+    /// The menu whose page is displayed; -1 while none has come to rest.
+    std::int32_t displayed;
+    bool going;
 };

@@ -15,7 +15,7 @@
 /// | Touching      | secondsToAdvance  | the next picture comes: Waiting or Advancing as it has a marker;      |
 /// | Advancing     | secondsToAdvance  | after the last one the first one comes back: Idle                     |
 /// | Advancing     | secondsToScroll   | a tall picture scrolls down: ScrollingBack                            |
-/// | ScrollingBack | secondsToScroll   | it scrolls back: Idle                                                 |
+/// | ScrollingBack | secondsToScroll   | it scrolls back: Idle; or down, if it is back already                 |
 ///
 /// The reply button is hidden in every state but Idle. At most one timer is pending, and none outlives the page.
 class KestDemonstration {
@@ -28,9 +28,8 @@ public:
     KestDemonstration(const KestDemonstration&) = delete;
     KestDemonstration& operator=(const KestDemonstration&) = delete;
 
-    /// Listen to the reply button of a sequence, or of a tall picture.
-    void createButtonHorizontal(Evas_Object* imageLayout);
-    void createButtonVertical(Evas_Object* imageLayout);
+    /// Listens to the reply button of the area's layout.
+    void createButton();
 
     /// Ends it where it is; the pictures stay as they are.
     void stop();
@@ -40,15 +39,19 @@ public:
     void reset();
 
 private:
-    using Step = bool (KestDemonstration::*)();
-
-    void __start(State next, double seconds, Step step);
-    void __end();
+    /// The one place where the state changes, and with it whether the button is hidden.
+    void __enter(State next);
+    /// The same, and the next step comes after so many seconds, and again as long as steps return true.
+    void __enter(State next, double seconds);
     void __release();
     void __press();
-    bool __touchStep();
-    bool __advanceStep();
-    bool __scrollStep();
+    /// What the state has due. Nothing when it is idle.
+    bool __step();
+    bool __touch();
+    bool __advance();
+    bool __scroll();
+    bool __scrollBack();
+    void __end();
 
     static void __pressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
     static void __releasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);

@@ -34,6 +34,10 @@ Evas_Object* KestContentSubView::onCreate(Evas_Object* parent, void*) {
     KEST_BEGIN();
     const std::string themeFile = KestCommon::getEdjFilePath(true);
     layout = elm_layout_add(parent);
+    if (!layout) {
+        KEST_ERR("the layout of page %d could not be made", index);
+        return nullptr;
+    }
     elm_layout_file_set(layout, themeFile.c_str(), "kest/content/main");
     KestSizeHints::expand(layout);
     // For this page: another pager may lie beneath, and its pages go on listening when this one's go.
@@ -90,10 +94,10 @@ void KestContentSubView::__fillLayout(Evas_Object* pageLayout) {
     demonstration.stop();
     if (pictures.isSequence()) {
         pictures.bringPageIn(0);
-        demonstration.createButtonHorizontal(pictures.imageLayout);
+        demonstration.createButton();
     } else if (pictures.isTall()) {
         pictures.bringIn(0);
-        demonstration.createButtonVertical(pictures.imageLayout);
+        demonstration.createButton();
     }
     __setInfoArea(pageLayout);
 }

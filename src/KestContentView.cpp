@@ -22,12 +22,15 @@ const int firstMenuIndex = 2;
 /// The other pages are filled when the chosen one has come to rest.
 const double secondsToOtherPages = 0.4;
 
+const std::int32_t noMenu = -1;
+
 }  // namespace
 
 const std::int32_t KestContentView::mostPages;
 
 KestContentView::KestContentView(int listIndex, bool onTop)
-    : __selectedView(listIndex - firstMenuIndex), pages(), pageCount(0), pushOnTop(onTop), appended(0) {
+    : __selectedView(listIndex - firstMenuIndex), pages(), pageCount(0), pushOnTop(onTop), appended(0),
+      displayed(noMenu), going(false) {
     KEST_BEGIN();
     KEST_INFO("__selectedView:%d", __selectedView);
     const size_t menus = KestContentMgr::getInstance()->getContentsList().size();
@@ -80,17 +83,12 @@ Elm_Object_Item* KestContentView::onPushToNaviframe(Evas_Object* naviframe) {
 
 void KestContentView::onPushed(Elm_Object_Item* naviItem) {
     KEST_BEGIN();
-    while (appended < pageCount) {
-        appendPage(pages[appended++]);
-    }
-    showPage(__selectedView, true);
+    __appendPages();
+    showPage(__placeOf(__selectedView), true);
 
     app_assist::WUiTimer::addIdler(
         [this, naviItem](app_assist::WView*) {
-            if (KestContentSubView* page = __pageAt(__selectedView)) {
-                page->onViewPrepare();
-                page->onViewDisplay(naviItem);
-            }
+            __prepareChosenPage(naviItem);
             return false;
         },
         this, getEvasObj());
@@ -104,31 +102,88 @@ void KestContentView::onPushed(Elm_Object_Item* naviItem) {
         this, getEvasObj());
 }
 
+// The base deletes a page that cannot be made, and the others stand without it.
+void KestContentView::__appendPages() {
+    for (; appended < pageCount; ++appended) {
+        const int taken = getPageCount();
+        appendPage(pages[appended]);
+        if (getPageCount() == taken) {
+            pages[appended] = nullptr;
+        }
+    }
+}
+
+void KestContentView::__prepareChosenPage(Elm_Object_Item* naviItem) {
+    const std::int32_t menu = __pageAt(__selectedView) ? __selectedView : __menuInView();
+    if (KestContentSubView* page = __pageAt(menu)) {
+        page->onViewPrepare();
+        __display(menu, naviItem);
+    }
+}
+
 // One after the other, so that no frame waits for all of them.
 void KestContentView::__preparePages() {
     std::int32_t next = 0;
     app_assist::WUiTimer::addIdler(
         [this, next](app_assist::WView*) mutable {
-            if (KestContentSubView* page = __pageAt(next)) {
-                page->onViewPrepare();
-            }
+            __prepare(next);
             return ++next < pageCount;
         },
         this, getEvasObj());
 }
 
+void KestContentView::__prepare(std::int32_t menu) {
+    KestContentSubView* page = __pageAt(menu);
+    if (!page) {
+        return;
+    }
+    const bool wasFilled = page->isFilled();
+    page->onViewPrepare();
+    // It was reached before there was anything to play.
+    if (menu == displayed && !wasFilled && page->isFilled()) {
+        __display(menu, getNaviItem());
+    }
+}
+
+void KestContentView::__display(std::int32_t menu, Elm_Object_Item* naviItem) {
+    if (KestContentSubView* page = __pageAt(menu)) {
+        displayed = menu;
+        page->onViewDisplay(naviItem);
+    }
+}
+
 // While the view goes its pages go first, and the scroller may still tell of movements.
-KestContentSubView* KestContentView::__pageAt(std::int32_t index) const {
-    return index >= 0 && index < appended && getPageCount() == pageCount ? pages[index] : nullptr;
+KestContentSubView* KestContentView::__pageAt(std::int32_t menu) const {
+    return !going && menu >= 0 && menu < appended ? pages[menu] : nullptr;
+}
+
+std::int32_t KestContentView::__placeOf(std::int32_t menu) const {
+    const std::int32_t before = std::max(0, std::min(menu, appended));
+    return menu - static_cast<std::int32_t>(std::count(pages, pages + before, nullptr));
+}
+
+std::int32_t KestContentView::__menuAt(std::int32_t place) const {
+    for (std::int32_t menu = 0; menu < appended; ++menu) {
+        if (pages[menu] && __placeOf(menu) == place) {
+            return menu;
+        }
+    }
+    return noMenu;
+}
+
+std::int32_t KestContentView::__menuInView() const {
+    int place = 0;
+    elm_scroller_current_page_get(getScroller(), &place, nullptr);
+    return __menuAt(place);
 }
 
 void KestContentView::showContentsPage(int index) {
     KEST_HIT();
     __selectedView = index;
     KEST_INFO("change view page to %d", __selectedView);
-    showPage(__selectedView, false);
-    if (KestContentSubView* page = __pageAt(__selectedView)) {
-        page->onViewDisplay(getNaviItem());
+    if (__pageAt(__selectedView)) {
+        showPage(__placeOf(__selectedView), false);
+        __display(__selectedView, getNaviItem());
     }
 }
 
@@ -141,24 +196,23 @@ void KestContentView::__backCb(void* data, Evas_Object*, void*) {
     elm_naviframe_item_pop(view->getNaviframe()->getEvasObj());
 }
 
-void KestContentView::__pageScrollStartCb(void* data, Evas_Object*, void*) {
+void KestContentView::__pageScrollStartCb(void* data, Evas_Object*, void*) try {
     KEST_HIT();
-    const auto* view = static_cast<KestContentView*>(data);
-    for (std::int32_t i = 0; i < view->pageCount; ++i) {
-        if (KestContentSubView* page = view->__pageAt(i)) {
+    auto* view = static_cast<KestContentView*>(data);
+    view->displayed = noMenu;
+    for (std::int32_t menu = 0; menu < view->pageCount; ++menu) {
+        if (KestContentSubView* page = view->__pageAt(menu)) {
             page->onPageScrollStart();
         }
     }
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
 }
 
-void KestContentView::__pageScrollStopCb(void* data, Evas_Object* scroller, void*) try {
+void KestContentView::__pageScrollStopCb(void* data, Evas_Object*, void*) try {
     KEST_HIT();
-    const auto* view = static_cast<KestContentView*>(data);
-    int horizontal = 0;
-    elm_scroller_current_page_get(scroller, &horizontal, nullptr);
-    if (KestContentSubView* page = view->__pageAt(horizontal)) {
-        page->onViewDisplay(view->getNaviItem());
-    }
+    auto* view = static_cast<KestContentView*>(data);
+    view->__display(view->__menuInView(), view->getNaviItem());
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }

@@ -16,6 +16,14 @@ const char replyPressed[] = "reply,pressed";
 /// The theme's own name for the release.
 const char replyReleased[] = "reply,uppressed";
 
+bool canScroll(const KestPictureArea& area) {
+    int height = 0;
+    int shown = 0;
+    elm_scroller_child_size_get(area.scroller, nullptr, &height);
+    elm_scroller_region_get(area.scroller, nullptr, nullptr, nullptr, &shown);
+    return height > shown;
+}
+
 void onSignal(Evas_Object* layout, const char* signal, Edje_Signal_Cb callback, void* data) {
     edje_object_signal_callback_add(elm_layout_edje_get(layout), signal, "*", callback, data);
 }
@@ -29,19 +37,14 @@ KestDemonstration::~KestDemonstration() {
     app_assist::WUiTimer::destroy(timer);
 }
 
-void KestDemonstration::createButtonHorizontal(Evas_Object* imageLayout) {
-    onSignal(imageLayout, replyPressed, __pressedCb, this);
-    onSignal(imageLayout, replyReleased, __releasedCb, this);
-}
-
-void KestDemonstration::createButtonVertical(Evas_Object* imageLayout) {
-    createButtonHorizontal(imageLayout);
+void KestDemonstration::createButton() {
+    onSignal(area.imageLayout, replyPressed, __pressedCb, this);
+    onSignal(area.imageLayout, replyReleased, __releasedCb, this);
 }
 
 void KestDemonstration::stop() {
     app_assist::WUiTimer::destroy(timer);
-    state = State::Idle;
-    replyHidden = 0;
+    __enter(State::Idle);
 }
 
 void KestDemonstration::restart() {
@@ -63,18 +66,16 @@ void KestDemonstration::reset() {
     area.hideTouchMarkers();
 }
 
-void KestDemonstration::__start(State next, double seconds, Step step) {
-    app_assist::WUiTimer::destroy(timer);
+void KestDemonstration::__enter(State next) {
     state = next;
-    timer = app_assist::WUiTimer::addTimer(
-        seconds, [this, step](app_assist::WView*) { return (this->*step)(); }, &view, area.imageLayout);
+    replyHidden = state == State::Idle ? 0 : 1;
 }
 
-void KestDemonstration::__end() {
-    state = State::Idle;
-    replyHidden = 0;
-    area.hideTouchMarkers();
-    area.emit("reply,show");
+void KestDemonstration::__enter(State next, double seconds) {
+    app_assist::WUiTimer::destroy(timer);
+    __enter(next);
+    timer = app_assist::WUiTimer::addTimer(
+        seconds, [this](app_assist::WView*) { return __step(); }, &view, area.imageLayout);
 }
 
 void KestDemonstration::__press() {
@@ -94,25 +95,40 @@ void KestDemonstration::__release() {
     if (!area.isAtStart()) {
         return;
     }
-    replyHidden = 1;
     area.emit("reply,hide");
     if (!area.isSequence()) {
-        __start(State::Advancing, secondsToScroll, &KestDemonstration::__scrollStep);
+        __enter(State::Advancing, secondsToScroll);
     } else if (area.hasTouchMarker(0)) {
-        __start(State::Waiting, secondsToTouch, &KestDemonstration::__touchStep);
+        __enter(State::Waiting, secondsToTouch);
     } else {
         area.emitToPage(0, "touch,hide");
-        __start(State::Advancing, secondsToAdvance, &KestDemonstration::__advanceStep);
+        __enter(State::Advancing, secondsToAdvance);
     }
 }
 
-bool KestDemonstration::__touchStep() {
+bool KestDemonstration::__step() {
+    switch (state) {
+    case State::Waiting:
+        return __touch();
+    case State::Touching:
+        return __advance();
+    case State::Advancing:
+        return area.isSequence() ? __advance() : __scroll();
+    case State::ScrollingBack:
+        return __scrollBack();
+    case State::Idle:
+        break;
+    }
+    return false;
+}
+
+bool KestDemonstration::__touch() {
     area.emitToPage(area.currentPage(), "touch,show");
-    __start(State::Touching, secondsToAdvance, &KestDemonstration::__advanceStep);
+    __enter(State::Touching, secondsToAdvance);
     return true;
 }
 
-bool KestDemonstration::__advanceStep() {
+bool KestDemonstration::__advance() {
     const int page = area.currentPage();
     if (area.imageCount - 1 <= page) {
         area.bringPageIn(0);
@@ -121,23 +137,36 @@ bool KestDemonstration::__advanceStep() {
     }
     area.bringPageIn(page + 1);
     if (area.hasTouchMarker(page + 1)) {
-        __start(State::Waiting, secondsToTouch, &KestDemonstration::__touchStep);
+        __enter(State::Waiting, secondsToTouch);
     } else {
-        state = State::Advancing;
+        __enter(State::Advancing);
     }
     return true;
 }
 
-bool KestDemonstration::__scrollStep() {
-    // A display may show the whole picture, so that nothing moves.
-    if (area.isAtStart() && state != State::ScrollingBack) {
-        area.bringIn(area.extraHeight);
-        state = State::ScrollingBack;
-        return true;
+bool KestDemonstration::__scroll() {
+    if (!area.isAtStart()) {
+        return __scrollBack();
+    }
+    area.bringIn(area.extraHeight);
+    __enter(State::ScrollingBack);
+    return true;
+}
+
+bool KestDemonstration::__scrollBack() {
+    // Something else may have brought it back. Where the display shows all of it, it never moves.
+    if (area.isAtStart() && canScroll(area)) {
+        return __scroll();
     }
     area.bringIn(0);
     __end();
     return false;
+}
+
+void KestDemonstration::__end() {
+    __enter(State::Idle);
+    area.hideTouchMarkers();
+    area.emit("reply,show");
 }
 
 void KestDemonstration::__pressedCb(void* data, Evas_Object*, const char*, const char*) try {
