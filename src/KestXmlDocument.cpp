@@ -90,8 +90,7 @@ bool giveTextsToParser() {
 /// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
 class Parsing {
 public:
-    explicit Parsing(const std::string& text)
-        : current{text, 0, false, bytesBetweenLooks, nullptr}, messageBytes(0) {
+    explicit Parsing(const std::string& text) : current{text, 0, false, bytesBetweenLooks, nullptr}, messageBytes(0) {
         static const bool given = giveTextsToParser();
         source = given ? &current : nullptr;
         xmlSetStructuredErrorFunc(this, __dropMessage);
