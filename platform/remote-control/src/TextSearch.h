@@ -12,7 +12,9 @@ namespace remote_control {
 /// there are.
 Text findText(const std::vector<Element>& screen, const std::string& wanted);
 
-/// Where a finger would touch to hit `wanted` within `text`: the middle of what is in sight of it.
+/// Where a finger would touch to hit `wanted` within `text`: the middle of what is in sight of it, which is one of its
+/// lines where it stands in a block of text. Empty when it is out of sight, also where other words of the block are
+/// not.
 Rectangle touchPlace(const Text& text, const std::string& wanted);
 
 /// Whether some text in sight equals or holds `wanted`.
