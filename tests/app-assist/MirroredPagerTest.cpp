@@ -156,6 +156,20 @@ TEST_F(MirroredPictures, StayWhereTheyAreWhenAnotherOneComes) {
     }
 }
 
+TEST_F(MirroredPictures, BeginWithTheFirstOneThatWasShownBeforeTheyAreLaidOut) {
+    TipPage filledLate("late", story_);
+    test_ui::inMainLoop([&] {
+        ASSERT_TRUE(filledLate.create(naviframe_.getEvasObj(), nullptr));
+        evas_object_resize(filledLate.getEvasObj(), 720, 1280);
+        evas_object_show(filledLate.getEvasObj());
+        filledLate.fill();
+        elm_scroller_page_show(filledLate.pictures, 0, 0);
+    });
+    test_ui::runFor(0.5);
+    EXPECT_EQ(0, filledLate.pictureInView());
+    EXPECT_EQ(geometry(filledLate.pictures).x, geometry(filledLate.pages[0]).x);
+}
+
 TEST_F(MirroredPictures, StayInOrderWhenReadingTurnsRound) {
     show(1);
     for (const bool mirrored : {false, true, false}) {
