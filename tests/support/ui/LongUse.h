@@ -1,0 +1,36 @@
+#pragma once
+
+#include <Elementary.h>
+
+#include <cstddef>
+#include <random>
+
+namespace test_ui {
+
+class Screen;
+
+/// A window in long use. Nothing is drawn meanwhile, which would take most of the time; what is left behind is counted.
+class LongUse {
+public:
+    explicit LongUse(const Evas_Object* window);
+    ~LongUse();
+    LongUse(const LongUse&) = delete;
+    LongUse& operator=(const LongUse&) = delete;
+
+    /// All Evas objects of the window, also those inside others.
+    int objects() const;
+    /// How often the main loop finds something to do in a second; timers and animators that were left behind add to it.
+    int turnsInASecond();
+    /// The bytes that the process has allocated.
+    static std::size_t memory();
+
+private:
+    Evas* canvas_;
+    Ecore_Idle_Enterer* beforeIdle_;
+    int turns_ = 0;
+};
+
+/// A finger's way from side to side across a screen 720 wide, fast or slow.
+void swipeAtRandom(Screen& screen, std::mt19937& random);
+
+}  // namespace test_ui
