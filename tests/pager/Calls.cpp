@@ -9,6 +9,7 @@
 #include <map>
 #include <optional>
 #include <sstream>
+#include <stdexcept>
 
 namespace {
 
@@ -23,6 +24,7 @@ double begin = 0;
 std::vector<Event> events;
 std::vector<std::string> otherCalls;
 std::map<std::string, int> failing;
+std::map<std::string, int> throwing;
 std::map<std::string, Evas_Smart_Cb> smartCallbacks;
 uxt_theme_changed_cb lastThemeCallback = nullptr;
 int screenWidth = 0;
@@ -111,6 +113,15 @@ std::vector<std::string> calls::story(int page) {
     return lines;
 }
 
+std::vector<std::string> calls::wholeStory() {
+    std::vector<std::string> lines;
+    for (const Event& event : events) {
+        std::string line = event.line;
+        lines.push_back(line.insert(line.find(' ') + 1, "page " + std::to_string(event.page) + ": "));
+    }
+    return lines;
+}
+
 std::vector<std::string> calls::steps(const std::vector<std::string>& words) {
     std::vector<std::string> found;
     for (const std::string& line : otherCalls)
@@ -121,6 +132,16 @@ std::vector<std::string> calls::steps(const std::vector<std::string>& words) {
 
 void calls::fail(const std::string& name, int time) {
     failing[name] = time;
+}
+
+void calls::throwIn(const std::string& name, int time) {
+    throwing[name] = time;
+}
+
+void calls::throwIfDue(const std::string& name) {
+    const auto found = throwing.find(name);
+    if (found != throwing.end() && --found->second == 0)
+        throw std::runtime_error(name + " failed");
 }
 
 void calls::setScreenWidth(int width) {
@@ -144,6 +165,8 @@ CALL(void, elm_object_signal_emit, Evas_Object* object, const char* signal, cons
     Evas_Object* page = pageOf(object);
     const std::string name = nameOf(object, page);
     if (!name.empty())
+        calls::throwIfDue("elm_object_signal_emit");
+    if (!name.empty())
         tell(page ? placeInRow(page).value_or(0) : -1,
              name + " " + signal + (*source ? std::string(" of ") + source : ""));
     __real_elm_object_signal_emit(object, signal, source);
@@ -155,6 +178,7 @@ CALL(void, elm_scroller_page_bring_in, Evas_Object* scroller, int horizontal, in
 }
 
 CALL(void, elm_scroller_page_show, Evas_Object* scroller, int horizontal, int vertical) {
+    calls::throwIfDue("elm_scroller_page_show");
     tellMovement(scroller, "at page " + std::to_string(horizontal));
     __real_elm_scroller_page_show(scroller, horizontal, vertical);
 }
@@ -191,6 +215,7 @@ CALL(Evas_Object*, elm_image_add, Evas_Object* parent) {
 
 CALL(void, elm_object_item_domain_translatable_part_text_set, Elm_Object_Item* item, const char* part,
      const char* domain, const char* text) {
+    calls::throwIfDue("elm_object_item_domain_translatable_part_text_set");
     note("title", orNull(part), orNull(domain), orNull(text));
     __real_elm_object_item_domain_translatable_part_text_set(item, part, domain, text);
 }
@@ -198,6 +223,20 @@ CALL(void, elm_object_item_domain_translatable_part_text_set, Elm_Object_Item* i
 CALL(Evas_Object*, elm_object_item_part_content_unset, Elm_Object_Item* item, const char* part) {
     note("unset", orNull(part));
     return __real_elm_object_item_part_content_unset(item, part);
+}
+
+CALL(void, elm_scroller_bounce_set, Evas_Object* scroller, Eina_Bool horizontal, Eina_Bool vertical) {
+    if (!pageOf(scroller))
+        note("bounce", horizontal ? "on" : "off", vertical ? "on" : "off");
+    __real_elm_scroller_bounce_set(scroller, horizontal, vertical);
+}
+
+CALL(void, elm_scroller_policy_set, Evas_Object* scroller, Elm_Scroller_Policy horizontal,
+     Elm_Scroller_Policy vertical) {
+    if (!pageOf(scroller))
+        note("bars", horizontal == ELM_SCROLLER_POLICY_OFF ? "off" : "on",
+             vertical == ELM_SCROLLER_POLICY_OFF ? "off" : "on");
+    __real_elm_scroller_policy_set(scroller, horizontal, vertical);
 }
 
 CALL(void, uxt_scroller_set_auto_scroll_enabled, Evas_Object* scroller, Eina_Bool enabled) {
@@ -224,6 +263,7 @@ CALL(void, uxt_theme_delete_changed_callback, Evas_Object* object, uxt_theme_cha
 }
 
 CALL(int, app_control_create, app_control_h* request) {
+    calls::throwIfDue("app_control_create");
     note("launch create");
     return __real_app_control_create(request);
 }

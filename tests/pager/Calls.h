@@ -19,11 +19,18 @@ void forget();
 /// Page -1 is the pager: "0.0 pages at page 2".
 std::vector<std::string> story(int page = 0);
 
+/// The story of all pages in one: "0.0 page 2: pictures at page 0".
+std::vector<std::string> wholeStory();
+
 /// Other calls in their order, those that begin with one of these words: "title", "launch", "record", "theme", ...
 std::vector<std::string> steps(const std::vector<std::string>& words);
 
 /// Has the call of that name give nothing, the how-manieth time from now.
 void fail(const std::string& name, int time = 1);
+/// Has the call of that name throw "<name> failed", once: the how-manieth time from now.
+void throwIn(const std::string& name, int time = 1);
+/// What a call of that name does that is to throw.
+void throwIfDue(const std::string& name);
 
 /// Has the display be that wide for who asks; 0: as wide as it is.
 void setScreenWidth(int width);

@@ -59,6 +59,15 @@ TEST_P(Interruption, ByASwipePutsThePicturesBackAndStopsThem) {
     EXPECT_EQ(pictureInView(), 0);
 }
 
+TEST_P(Interruption, ByASwipeGivesTheButtonBack) {
+    play();
+    swipe();
+    test_ui::runFor(1);
+    calls::forget();
+    pressReply();
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide", "0.0 area reply,press,show"));
+}
+
 TEST_P(Interruption, ByASwipeThereAndBackStartsOver) {
     play();
     swipe();
@@ -136,6 +145,19 @@ TEST_F(InterruptedTallPicture, AtItsTopStaysThereAtASwipe) {
     test_ui::runFor(20);
     ASSERT_EQ(pageInView(), 1);
     EXPECT_THAT(calls::story(), IsEmpty());
+}
+
+TEST_F(InterruptedTallPicture, GetsItsButtonBackByASwipe) {
+    drawPicture("a_01.png", 716, 900);
+    drawPicture("plain.png");
+    writeTips({tip("a_01.png"), tip("plain.png")});
+    open();
+    test_ui::runFor(0.5);
+    swipe();
+    test_ui::runFor(1);
+    calls::forget();
+    pressReply();
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 area reply,hide", "0.0 area reply,press,show"));
 }
 
 TEST_F(InterruptedTallPicture, StartsOverWhenASwipeComesBack) {

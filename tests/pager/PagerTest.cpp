@@ -77,13 +77,14 @@ void PagerTest::startEmpty() {
     newLog();
 }
 
-void PagerTest::push(int menu, bool onTop) {
+void PagerTest::push(int menu, bool onTop, const std::function<void(Pager&)>& meanwhile) {
     if (!running_)
         startEmpty();
     calls::forget();
     test_ui::inMainLoop([&] {
         pager_ = new Pager(menu + 2, onTop);
         naviframe().push(pager_, nullptr, nullptr);
+        meanwhile(pager());
     });
 }
 

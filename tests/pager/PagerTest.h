@@ -8,6 +8,7 @@
 
 #include <gmock/gmock.h>
 
+#include <functional>
 #include <set>
 #include <string>
 #include <vector>
@@ -44,7 +45,9 @@ protected:
     /// Starts the application without a first view.
     void startEmpty();
     /// Pushes the pager at that menu, counting from 0, starting the application before if need be.
-    void push(int menu = 0, bool onTop = true);
+    /// `meanwhile` comes before the main loop turns.
+    void push(
+        int menu = 0, bool onTop = true, const std::function<void(Pager&)>& meanwhile = [](Pager&) {});
     /// Pushes it and waits until the page is filled and displayed; story() begins with the display.
     void open(int menu = 0);
     /// The pager pushed last.

@@ -85,6 +85,60 @@ TEST_F(Preparation, PlaysAPageThatASwipeReachedBefore) {
     EXPECT_THAT(calls::story(1), Contains(testing::EndsWith("area reply,show")));
 }
 
+TEST_F(Preparation, PlaysAPageThatARequestReachedBefore) {
+    drawSequence(2);
+    writeTips({tip("none.png"), tip("a_01.png")});
+    open();
+    test_ui::inMainLoop([&] { pager().showContentsPage(1); });
+    ASSERT_FALSE(isFilled(1));
+    test_ui::runFor(10);
+    EXPECT_THAT(calls::story(1),
+                ElementsAre("0.4 pictures to page 0", "0.4 pictures at page 0", "0.4 area reply,uppressed",
+                            "0.4 info show", "0.4 picture 0 touch,hide", "0.4 area reply,hide",
+                            "0.4 picture 0 touch,hide", "2.4 pictures to page 1", "4.4 pictures to page 0",
+                            "4.4 picture 0 touch,hide", "4.4 area reply,show"));
+    EXPECT_EQ(calls::steps({"title"}),
+              (std::vector<std::string>{"title elm.text.title kest Tips 1/2", "title elm.text.title kest Tips 2/2",
+                                        "title elm.text.title kest Tips 2/2"}));
+}
+
+TEST_F(Preparation, DoesNotPlayAPageThatARequestLeft) {
+    drawSequence(2);
+    writeTips({tip("none.png"), tip("a_01.png")});
+    open();
+    test_ui::inMainLoop([&] { pager().showContentsPage(1); });
+    test_ui::inMainLoop([&] { pager().showContentsPage(0); });
+    test_ui::runFor(10);
+    EXPECT_THAT(calls::story(1), ElementsAre("0.4 pictures to page 0"));
+    EXPECT_EQ(title(), "Tips 1/2");
+}
+
+TEST_F(Preparation, DoesNotPlayAPageThatASwipeIsLeaving) {
+    drawSequence(2);
+    writeTips({tip("none.png"), tip("a_01.png")});
+    open();
+    test_ui::inMainLoop([&] { pager().showContentsPage(1); });
+    const test_ui::Point middle = test_ui::geometry(page(1)).middle();
+    screen().swipe({middle.x - 260, middle.y}, {middle.x + 260, middle.y}, 0.2);
+    ASSERT_FALSE(isFilled(1));
+    test_ui::runFor(10);
+    ASSERT_EQ(pageInView(), 0);
+    EXPECT_THAT(calls::story(1), ElementsAre("0.4 pictures to page 0"));
+}
+
+TEST_F(Preparation, FillsThePageThatARequestChoseBeforeItWasIdle) {
+    drawSequence(2);
+    writeTips({tip("none.png", "A"), tip("none.png", "B"), tip("a_01.png", "C")});
+    push(0, true, [](Pager& view) { view.showContentsPage(2); });
+    test_ui::runFor(0.3);
+    EXPECT_THAT(filled(), ElementsAre(false, false, true));
+    EXPECT_EQ(pageInView(), 2);
+    EXPECT_EQ(title(), "Tips 3/3");
+    EXPECT_THAT(calls::story(2), Contains("0.0 area reply,uppressed"));
+    test_ui::runFor(5);
+    EXPECT_THAT(calls::story(2), Contains("4.0 area reply,show"));
+}
+
 TEST_F(Preparation, TitlesAPageThatARequestShowedBefore) {
     open();
     test_ui::inMainLoop([&] { pager().showContentsPage(2); });

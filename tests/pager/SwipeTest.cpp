@@ -78,16 +78,25 @@ TEST_F(Swipe, BeforeTheFirstPageBouncesAndDisplaysItAgainOnce) {
     EXPECT_THAT(newLog(), ElementsAre(hit("__pageScrollStartCb"), hit("__pageScrollStopCb"), display()));
 }
 
-TEST_F(Swipe, OfAPagerWithOnePageStaysThere) {
+// EFL drags nothing that it shows whole, so there is not even a bounce.
+TEST_F(Swipe, OfAPagerWithOnePageMovesNothing) {
     writeTips({tip("none.png", "A")});
     openAtRest();
-    swipe();
-    test_ui::runFor(2);
-    swipe(-1);
-    test_ui::runFor(2);
-    EXPECT_EQ(pageInView(), 0);
-    EXPECT_EQ(title(), "Tips 1/1");
-    EXPECT_EQ(topView(), "KestContentView");
+    const test_ui::Point middle = test_ui::geometry(video()).middle();
+    for (const int way : {-1, 1}) {
+        screen().press(middle);
+        for (int step = 1; step <= 5; ++step) {
+            test_ui::runFor(0.02);
+            screen().moveTo({middle.x + way * 50 * step, middle.y});
+        }
+        test_ui::runFor(0.02);
+        EXPECT_EQ(test_ui::geometry(page()).x, 0);
+        screen().lift();
+        test_ui::runFor(2);
+        EXPECT_EQ(test_ui::geometry(page()).x, 0);
+        EXPECT_EQ(title(), "Tips 1/1");
+        EXPECT_THAT(newLog(), IsEmpty());
+    }
 }
 
 TEST_F(Swipe, ThatIsTooShortDisplaysThePageAgain) {
@@ -106,6 +115,16 @@ TEST_F(Swipe, StopsThePicturesOfEveryPage) {
     swipe();
     for (const int index : {0, 1, 2})
         EXPECT_THAT(calls::story(index), ElementsAre("0.2 pictures at page 0", "0.2 picture 0 touch,hide")) << index;
+}
+
+TEST_F(Swipe, StopsThePagesInTheirOrder) {
+    drawSequence(2, {0});
+    writeTips({tip("a_01.png"), tip("a_01.png"), tip("a_01.png")});
+    openAtRest(1);
+    swipe();
+    EXPECT_THAT(calls::wholeStory(), ElementsAre("0.2 page 0: pictures at page 0", "0.2 page 0: picture 0 touch,hide",
+                                                 "0.2 page 1: pictures at page 0", "0.2 page 1: picture 0 touch,hide",
+                                                 "0.2 page 2: pictures at page 0", "0.2 page 2: picture 0 touch,hide"));
 }
 
 TEST_F(Swipe, PlaysThePageThatItComesTo) {

@@ -118,6 +118,20 @@ TEST_F(TallPicture, StartsOverAtOnceWhenItIsDisplayedWhileScrolledDown) {
                             "2.0 pictures to y 145", "4.0 pictures to y 0", "4.0 area reply,show"));
 }
 
+TEST_F(TallPicture, ThatSomethingBroughtBackScrollsDownAgain) {
+    play(800, 3.5);
+    ASSERT_EQ(scrolledTo(), 145);
+    elm_scroller_region_show(pictureScroller(), 0, 0, 716, 655);
+    ASSERT_EQ(scrolledTo(), 0);
+    calls::forget();
+    pressReply();
+    test_ui::runFor(1.4);
+    EXPECT_EQ(scrolledTo(), 145);
+    test_ui::runFor(20);
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 area reply,hide", "0.5 pictures to y 145", "2.5 pictures to y 0",
+                                            "2.5 area reply,show"));
+}
+
 TEST_F(TallPicture, GivesItsButtonBackWhereTheDisplayShowsAllOfIt) {
     useSmallScreen();
     play(760, 20);
