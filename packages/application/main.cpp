@@ -3,6 +3,7 @@
 #include "RequestView.h"
 
 #include <app-assist/WApp.h>
+#include <app-assist/WAppEventHandler.h>
 #include <app-assist/WNaviframe.h>
 #include <app-assist/WWindow.h>
 #include <app_common.h>
@@ -58,7 +59,17 @@ class RequestedApp : public app_assist::WApp {
         getWindow()->attachBaseUiObject(naviframe, nullptr);
         auto* view = new RequestView(self.icon);
         naviframe->push(view, self.label.c_str(), nullptr);
+        const auto rename = [this](app_event_info_h, void*) { showName(); };
+        events_.addEventHandler(APP_EVENT_LANGUAGE_CHANGED, rename, nullptr);
         return true;
+    }
+
+    void showName() {
+        const std::string label = Self().label;
+        elm_win_title_set(getWindow()->getEvasObj(), label.c_str());
+        auto* naviframe = static_cast<app_assist::WNaviframe*>(getWindow()->getBaseUiObject());
+        if (const app_assist::WView* top = naviframe->getTopView())
+            elm_object_item_part_text_set(top->getNaviItem(), "elm.text.title", label.c_str());
     }
 
     void onAppControl(app_control_h request, bool) override {
@@ -70,6 +81,8 @@ class RequestedApp : public app_assist::WApp {
         app_control_foreach_extra_data(request, appendLine, &lines);
         view->show(lines);
     }
+
+    app_assist::WAppEventHandler events_;
 };
 
 }  // namespace

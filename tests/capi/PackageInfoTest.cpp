@@ -1,6 +1,8 @@
 #include "package_info.h"
 
 #include "Owned.h"
+#include "device/Device.h"
+#include "device/Keys.h"
 #include "package_manager.h"
 #include "support/TemporaryDevice.h"
 
@@ -44,6 +46,22 @@ TEST(PackageInfo, MayLackVersionAndIcon) {
     char* label = nullptr;
     EXPECT_EQ(package_info_get_label(info, &label), PACKAGE_MANAGER_ERROR_NONE);
     EXPECT_EQ(owned(label), "com.example.bare");
+    package_info_destroy(info);
+}
+
+TEST(PackageInfo, NamesTheApplicationInTheDisplayLanguage) {
+    const TemporaryDevice device;
+    writeFile(device.preinstalled() / "com.example.tea/tizen-manifest.xml",
+              "<manifest package='com.example.tea'><ui-application appid='com.example.tea'><label>Tea</label>"
+              "<label xml:lang='ko-kr'>차</label></ui-application></manifest>");
+    package_info_h info = nullptr;
+    ASSERT_EQ(package_info_create("com.example.tea", &info), PACKAGE_MANAGER_ERROR_NONE);
+    for (const auto& [language, name] : {std::pair("en_US", "Tea"), std::pair("ko_KR", "차")}) {
+        device::Device::current().settings().set(device::keys::language, std::string(language) + ".UTF-8");
+        char* label = nullptr;
+        EXPECT_EQ(package_info_get_label(info, &label), PACKAGE_MANAGER_ERROR_NONE);
+        EXPECT_EQ(owned(label), name);
+    }
     package_info_destroy(info);
 }
 

@@ -44,7 +44,7 @@ int package_info_get_version(package_info_h info, char** version);
 int package_info_get_icon(package_info_h info, char** path);
 
 /**
- * Gives the name of the package's application, for people.
+ * Gives the name of the package's application, for people: in the display language where the manifest has it in that.
  * @param[out] label the package's id where the manifest gives none; to be freed with free(); untouched on error
  * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
  */

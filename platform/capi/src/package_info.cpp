@@ -62,10 +62,10 @@ int package_info_get_icon(package_info_h info, char** path) {
 }
 
 int package_info_get_label(package_info_h info, char** label) {
-    return service::call("package_info_get_label", [&]() -> int {
+    return service::callOnDevice("package_info_get_label", [&](device::Device& device) -> int {
         if (!info || !label)
             return PACKAGE_MANAGER_ERROR_INVALID_PARAMETER;
-        *label = service::copyOf(info->package.label);
+        *label = service::copyOf(info->package.labelIn(device.language()));
         return PACKAGE_MANAGER_ERROR_NONE;
     });
 }

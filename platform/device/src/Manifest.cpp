@@ -3,6 +3,7 @@
 #include "device/Error.h"
 #include "device/Packages.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <fcntl.h>
 #include <libxml/parser.h>
@@ -10,6 +11,7 @@
 #include <string_view>
 #include <sys/stat.h>
 #include <unistd.h>
+#include <utility>
 
 namespace device {
 namespace {
@@ -101,12 +103,30 @@ xmlNode* childNamed(xmlNode* parent, std::string_view name) {
     return nullptr;
 }
 
-/// The label for all languages; one with a language is for that language only.
-std::string labelOf(xmlNode* application) {
-    for (xmlNode* child = application->children; child; child = child->next)
-        if (nameOf(child) == "label" && !xmlHasProp(child, reinterpret_cast<const xmlChar*>("lang")))
-            return trimmed(stringOf(Text(xmlNodeGetContent(child))));
-    return "";
+/// "ko_kr" for "ko-KR".
+std::string lowered(std::string language) {
+    std::transform(language.begin(), language.end(), language.begin(), [](char c) {
+        const bool isUpper = c >= 'A' && c <= 'Z';
+        return c == '-' ? '_' : isUpper ? static_cast<char>(c - 'A' + 'a') : c;
+    });
+    return language;
+}
+
+/// The application's name, for all languages and for those that have one of their own.
+void readLabels(Package& package, xmlNode* application) {
+    bool hasLabel = false;
+    for (xmlNode* child = application->children; child; child = child->next) {
+        if (nameOf(child) != "label")
+            continue;
+        const std::string language = lowered(attributeOf(child, "lang"));
+        const std::string label = trimmed(stringOf(Text(xmlNodeGetContent(child))));
+        if (label.empty())
+            continue;
+        if (!language.empty())
+            package.labels.emplace(language, label);
+        else if (!std::exchange(hasLabel, true))
+            package.label = label;
+    }
 }
 
 /// The path of a file that the manifest names below one of the package's folders; "" for no name.
@@ -127,8 +147,7 @@ void readApplication(Package& package, xmlNode* application, const std::filesyst
         fail(file, line,
              "the application's id \"" + id + "\" differs from the package's, \"" + package.id +
                  "\"; they must be equal");
-    if (const std::string label = labelOf(application); !label.empty())
-        package.label = label;
+    readLabels(package, application);
     package.exec = pathBelow(package.root / "bin", attributeOf(application, "exec"), file, line);
     if (xmlNode* icon = childNamed(application, "icon"))
         package.icon = pathBelow(package.root / "shared/res", trimmed(stringOf(Text(xmlNodeGetContent(icon)))), file,
@@ -136,6 +155,14 @@ void readApplication(Package& package, xmlNode* application, const std::filesyst
 }
 
 }  // namespace
+
+const std::string& Package::labelIn(const std::string& language) const {
+    const std::string wanted = lowered(language);
+    for (const std::string& name : {wanted, wanted.substr(0, wanted.find('_'))})
+        if (const auto found = labels.find(name); found != labels.end())
+            return found->second;
+    return label;
+}
 
 Package readManifest(const std::filesystem::path& root) {
     const std::filesystem::path file = root / "tizen-manifest.xml";

@@ -25,7 +25,7 @@ Example:
 
 constexpr char packagesAbout[] =
     R"(One package a line: its id, its version, whether it is preinstalled on every device or installed on this one,
-and its name. --json tells its icon and its folder too.
+and its name in the display language. --json tells its icon and its folder too.
 
 Examples:
   kest-device packages
@@ -63,15 +63,17 @@ void uninstall(Session& session, const std::string& id) {
 void list(Session& session, bool json) {
     Json all = Json::array();
     std::vector<std::vector<std::string>> rows;
+    const std::string language = session.device().language();
     for (const device::Package& package : session.device().packages().all()) {
+        const std::string& label = package.labelIn(language);
         all.push_back({{"id", package.id},
                        {"version", package.version},
-                       {"label", package.label},
+                       {"label", label},
                        {"preinstalled", package.preinstalled},
                        {"icon", package.icon},
                        {"root", package.root.string()}});
         rows.push_back({package.id, package.version.empty() ? "-" : package.version,
-                        package.preinstalled ? "preinstalled" : "installed", oneLine(package.label)});
+                        package.preinstalled ? "preinstalled" : "installed", oneLine(label)});
     }
     json ? print(all) : printTable(rows);
 }

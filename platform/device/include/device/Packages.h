@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
@@ -16,13 +17,19 @@ struct PackageEvent;
 
 /// What a package's tizen-manifest.xml says of it, and where it lies.
 struct Package {
-    std::string id;              ///< package id, equal to the id of its application
-    std::string version;         ///< possibly empty
-    std::string label;           ///< the application's name; the id when the manifest gives none
+    std::string id;       ///< package id, equal to the id of its application
+    std::string version;  ///< possibly empty
+    std::string label;    ///< the application's name; the id when the manifest gives none
+    /// Its names in languages, as "ko_kr" or "ko".
+    std::map<std::string, std::string> labels;
     std::string icon;            ///< absolute path of the icon; empty when the manifest names none
     std::string exec;            ///< absolute path of the executable; empty when the manifest names none
     std::filesystem::path root;  ///< the package's folder; shared resources are in root/shared/res/
     bool preinstalled = false;   ///< true: part of the build; false: installed on this device
+
+    /// The application's name in a display language ("ko_KR"): the one of that language and country, else of the
+    /// language alone, else the one for all.
+    const std::string& labelIn(const std::string& language) const;
 };
 
 /// Reads `<root>/tizen-manifest.xml`.
