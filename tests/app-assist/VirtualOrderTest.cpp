@@ -33,7 +33,7 @@ struct App : app_assist::WApp {
 
 struct View : app_assist::WView {
     static std::vector<std::size_t> placesOfLife() {
-        return {place(&View::create),    place(&View::destroy),   place(&View::getEvasObj), place(&View::getClassName),
+        return {place(&View::create),   place(&View::destroy),   place(&View::getEvasObj), place(&View::getClassName),
                 place(&View::onCreate), place(&View::onCreated), place(&View::onDestroy)};
     }
     static std::vector<std::size_t> placesOnNaviframe() {
