@@ -10,17 +10,18 @@
 ///
 /// | state         | after             | what happens then                                                     |
 /// |---------------|-------------------|-----------------------------------------------------------------------|
-/// | Idle          | the release       | Waiting where the first picture has a marker, else Advancing          |
+/// | Idle          | the release       | Waiting where the first picture has a marker, else Advancing;         |
+/// |               |                   | Scrolling with a tall picture                                         |
 /// | Waiting       | secondsToTouch    | the marker of the picture in view shows: Touching                     |
 /// | Touching      | secondsToAdvance  | the next picture comes: Waiting or Advancing as it has a marker;      |
 /// | Advancing     | secondsToAdvance  | after the last one the first one comes back: Idle                     |
-/// | Advancing     | secondsToScroll   | a tall picture scrolls down: ScrollingBack                            |
+/// | Scrolling     | secondsToScroll   | a tall picture scrolls down: ScrollingBack                            |
 /// | ScrollingBack | secondsToScroll   | it scrolls back: Idle; or down, if it is back already                 |
 ///
 /// The reply button is hidden in every state but Idle. At most one timer is pending, and none outlives the page.
 class KestDemonstration {
 public:
-    enum class State { Idle, Waiting, Touching, Advancing, ScrollingBack };
+    enum class State { Idle, Waiting, Touching, Advancing, Scrolling, ScrollingBack };
 
     /// Both outlive it. The timers end with the view and with the area's layout.
     KestDemonstration(KestPictureArea& pictureArea, app_assist::WView& pageView);
@@ -28,8 +29,10 @@ public:
     KestDemonstration(const KestDemonstration&) = delete;
     KestDemonstration& operator=(const KestDemonstration&) = delete;
 
-    /// Listens to the reply button of the area's layout.
-    void createButton();
+    /// Listens to the reply button of the layout of a sequence.
+    void createButtonHorizontal(Evas_Object* imageLayout);
+    /// The same for a tall picture.
+    void createButtonVertical(Evas_Object* imageLayout);
 
     /// Ends it where it is; the pictures stay as they are.
     void stop();
@@ -43,8 +46,9 @@ private:
     void __enter(State next);
     /// The same, and the next step comes after so many seconds, and again as long as steps return true.
     void __enter(State next, double seconds);
-    void __release();
     void __press();
+    void __releaseSequence();
+    void __releaseTall();
     /// What the state has due. Nothing when it is idle.
     bool __step();
     bool __touch();
@@ -53,8 +57,10 @@ private:
     bool __scrollBack();
     void __end();
 
-    static void __pressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
-    static void __releasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+    static void __sequencePressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+    static void __sequenceReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+    static void __tallPressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+    static void __tallReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 
     KestPictureArea& area;
     app_assist::WView& view;

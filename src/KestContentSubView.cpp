@@ -94,10 +94,10 @@ void KestContentSubView::__fillLayout(Evas_Object* pageLayout) {
     demonstration.stop();
     if (pictures.isSequence()) {
         pictures.bringPageIn(0);
-        demonstration.createButton();
+        demonstration.createButtonHorizontal(pictures.imageLayout);
     } else if (pictures.isTall()) {
         pictures.bringIn(0);
-        demonstration.createButton();
+        demonstration.createButtonVertical(pictures.imageLayout);
     }
     __setInfoArea(pageLayout);
 }

@@ -37,9 +37,14 @@ KestDemonstration::~KestDemonstration() {
     app_assist::WUiTimer::destroy(timer);
 }
 
-void KestDemonstration::createButton() {
-    onSignal(area.imageLayout, replyPressed, __pressedCb, this);
-    onSignal(area.imageLayout, replyReleased, __releasedCb, this);
+void KestDemonstration::createButtonHorizontal(Evas_Object* imageLayout) {
+    onSignal(imageLayout, replyPressed, __sequencePressedCb, this);
+    onSignal(imageLayout, replyReleased, __sequenceReleasedCb, this);
+}
+
+void KestDemonstration::createButtonVertical(Evas_Object* imageLayout) {
+    onSignal(imageLayout, replyPressed, __tallPressedCb, this);
+    onSignal(imageLayout, replyReleased, __tallReleasedCb, this);
 }
 
 void KestDemonstration::stop() {
@@ -79,9 +84,6 @@ void KestDemonstration::__enter(State next, double seconds) {
 }
 
 void KestDemonstration::__press() {
-    if (area.isSequence()) {
-        KestUsageLog::replyPressed();
-    }
     if (!area.isAtStart()) {
         return;
     }
@@ -91,18 +93,23 @@ void KestDemonstration::__press() {
     }
 }
 
-void KestDemonstration::__release() {
+void KestDemonstration::__releaseSequence() {
     if (!area.isAtStart()) {
         return;
     }
     area.emit("reply,hide");
-    if (!area.isSequence()) {
-        __enter(State::Advancing, secondsToScroll);
-    } else if (area.hasTouchMarker(0)) {
+    if (area.hasTouchMarker(0)) {
         __enter(State::Waiting, secondsToTouch);
     } else {
         area.emitToPage(0, "touch,hide");
         __enter(State::Advancing, secondsToAdvance);
+    }
+}
+
+void KestDemonstration::__releaseTall() {
+    if (area.isAtStart()) {
+        area.emit("reply,hide");
+        __enter(State::Scrolling, secondsToScroll);
     }
 }
 
@@ -111,9 +118,10 @@ bool KestDemonstration::__step() {
     case State::Waiting:
         return __touch();
     case State::Touching:
-        return __advance();
     case State::Advancing:
-        return area.isSequence() ? __advance() : __scroll();
+        return __advance();
+    case State::Scrolling:
+        return __scroll();
     case State::ScrollingBack:
         return __scrollBack();
     case State::Idle:
@@ -169,14 +177,27 @@ void KestDemonstration::__end() {
     area.emit("reply,show");
 }
 
-void KestDemonstration::__pressedCb(void* data, Evas_Object*, const char*, const char*) try {
+void KestDemonstration::__sequencePressedCb(void* data, Evas_Object*, const char*, const char*) try {
+    KestUsageLog::replyPressed();
     static_cast<KestDemonstration*>(data)->__press();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }
 
-void KestDemonstration::__releasedCb(void* data, Evas_Object*, const char*, const char*) try {
-    static_cast<KestDemonstration*>(data)->__release();
+void KestDemonstration::__sequenceReleasedCb(void* data, Evas_Object*, const char*, const char*) try {
+    static_cast<KestDemonstration*>(data)->__releaseSequence();
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
+}
+
+void KestDemonstration::__tallPressedCb(void* data, Evas_Object*, const char*, const char*) try {
+    static_cast<KestDemonstration*>(data)->__press();
+} catch (const std::exception& error) {
+    KEST_ERR("%s", error.what());
+}
+
+void KestDemonstration::__tallReleasedCb(void* data, Evas_Object*, const char*, const char*) try {
+    static_cast<KestDemonstration*>(data)->__releaseTall();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }

@@ -11,6 +11,14 @@ protected:
     void openAtRest() {
         drawSequence(2);
         writeTips({tip("a_01.png", "<a href=app>Open</a>"), tip("a_01.png")});
+        rest();
+    }
+    void openTallAtRest() {
+        drawPicture("a_01.png", 716, 1000);
+        writeTip();
+        rest();
+    }
+    void rest() {
         open();
         test_ui::runFor(6);
         newLog();
@@ -53,7 +61,7 @@ TEST_F(Guard, StandsBeforeThePressedButton) {
     openAtRest();
     calls::throwIn("elm_object_signal_emit");
     pressReply();
-    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__pressedCb", "elm_object_signal_emit")));
+    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__sequencePressedCb", "elm_object_signal_emit")));
     releaseReply();
     EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide", "0.0 picture 0 touch,hide"));
 }
@@ -62,9 +70,25 @@ TEST_F(Guard, StandsBeforeTheReleasedButton) {
     openAtRest();
     calls::throwIn("elm_object_signal_emit");
     releaseReply();
-    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__releasedCb", "elm_object_signal_emit")));
+    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__sequenceReleasedCb", "elm_object_signal_emit")));
     releaseReply();
     EXPECT_THAT(calls::story(), ElementsAre("0.0 area reply,hide", "0.0 picture 0 touch,hide"));
+}
+
+TEST_F(Guard, StandsBeforeThePressedButtonOfATallPicture) {
+    openTallAtRest();
+    calls::throwIn("elm_object_signal_emit");
+    pressReply();
+    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__tallPressedCb", "elm_object_signal_emit")));
+}
+
+TEST_F(Guard, StandsBeforeTheReleasedButtonOfATallPicture) {
+    openTallAtRest();
+    calls::throwIn("elm_object_signal_emit");
+    releaseReply();
+    EXPECT_THAT(newErrors(), ElementsAre(error(demonstrationFile, "__tallReleasedCb", "elm_object_signal_emit")));
+    releaseReply();
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 area reply,hide"));
 }
 
 TEST_F(Guard, StandsBeforeTheBeginOfAMovement) {
