@@ -2,7 +2,6 @@
 #include "TimerCalls.h"
 #include "ui/LongUse.h"
 
-#include <cstdlib>
 #include <fstream>
 #include <random>
 
@@ -12,12 +11,6 @@ using testing::IsEmpty;
 namespace {
 
 constexpr unsigned int seed = 20150401;
-
-/// A short run is part of every run of the tests; KEST_SOAK=full asks for a long one, of some minutes each.
-int times(int shortRun, int longRun) {
-    const char* asked = std::getenv("KEST_SOAK");
-    return asked && std::string(asked) == "full" ? longRun : shortRun;
-}
 
 }  // namespace
 
@@ -121,9 +114,9 @@ INSTANTIATE_TEST_SUITE_P(In, Soak, testing::Values("en_US.UTF-8", "ru_RU.UTF-8",
                          [](const auto& language) { return language.param.substr(0, 2); });
 
 TEST_P(Soak, OfOpeningsAndClosingsLeavesNothingBehind) {
-    const int openings = times(10, 1000);
+    const int openings = test_ui::timesOf(10, 1000);
     SCOPED_TRACE("seed " + std::to_string(seed));
-    for (int time = 0; time < times(5, 100); ++time)
+    for (int time = 0; time < test_ui::timesOf(5, 100); ++time)
         ASSERT_NO_FATAL_FAILURE(openAndClose()) << "at opening " << time;
     test_ui::runFor(1);
     newLog();
@@ -140,7 +133,7 @@ TEST_P(Soak, OfOpeningsAndClosingsLeavesNothingBehind) {
 }
 
 TEST_P(Soak, OfSwipesEndsOnAPageThatIsDisplayedAndPlays) {
-    const int swipes = times(80, 10000);
+    const int swipes = test_ui::timesOf(80, 10000);
     SCOPED_TRACE("seed " + std::to_string(seed));
     open(3);
     test_ui::runFor(2);

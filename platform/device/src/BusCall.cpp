@@ -25,6 +25,32 @@ Message newCall(const std::string& destination, const std::string& path, const s
     return call;
 }
 
+/// A container that is being filled; one that is not closed, since what was to go into it is refused, is let go.
+class Container {
+public:
+    Container(DBusMessageIter* outer, int type, const char* signature) : outer_(outer) {
+        if (!dbus_message_iter_open_container(outer_, type, signature, &inner_))
+            throw std::bad_alloc();
+    }
+    ~Container() {
+        if (outer_)
+            dbus_message_iter_abandon_container(outer_, &inner_);
+    }
+    Container(const Container&) = delete;
+    Container& operator=(const Container&) = delete;
+
+    DBusMessageIter* inside() { return &inner_; }
+    void close() {
+        // Whatever comes of it, libdbus has let go of it.
+        if (!dbus_message_iter_close_container(std::exchange(outer_, nullptr), &inner_))
+            throw std::bad_alloc();
+    }
+
+private:
+    DBusMessageIter* outer_;
+    DBusMessageIter inner_{};
+};
+
 struct Appender {
     DBusMessageIter* arguments;
 
@@ -44,24 +70,14 @@ struct Appender {
         append(DBUS_TYPE_BOOLEAN, &value);
     }
     void operator()(const BusCall::Texts& texts) const {
-        DBusMessageIter dictionary;
-        DBusMessageIter entry;
-        open(arguments, DBUS_TYPE_ARRAY, "{ss}", dictionary);
+        Container dictionary(arguments, DBUS_TYPE_ARRAY, "{ss}");
         for (const auto& [key, value] : texts) {
-            open(&dictionary, DBUS_TYPE_DICT_ENTRY, nullptr, entry);
-            Appender{&entry}(key);
-            Appender{&entry}(value);
-            close(&dictionary, entry);
+            Container entry(dictionary.inside(), DBUS_TYPE_DICT_ENTRY, nullptr);
+            Appender{entry.inside()}(key);
+            Appender{entry.inside()}(value);
+            entry.close();
         }
-        close(arguments, dictionary);
-    }
-    static void open(DBusMessageIter* outer, int type, const char* signature, DBusMessageIter& inner) {
-        if (!dbus_message_iter_open_container(outer, type, signature, &inner))
-            throw std::bad_alloc();
-    }
-    static void close(DBusMessageIter* outer, DBusMessageIter& inner) {
-        if (!dbus_message_iter_close_container(outer, &inner))
-            throw std::bad_alloc();
+        dictionary.close();
     }
     void append(int type, const void* value) const {
         if (!dbus_message_iter_append_basic(arguments, type, value))

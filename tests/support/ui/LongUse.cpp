@@ -8,7 +8,9 @@
 
 #include <Ecore_Evas.h>
 #include <Eo.h>
+#include <cstdlib>
 #include <malloc.h>
+#include <string>
 
 namespace {
 
@@ -56,6 +58,11 @@ int test_ui::LongUse::turnsInASecond() {
 
 std::size_t test_ui::LongUse::memory() {
     return mallinfo2().uordblks;
+}
+
+int test_ui::timesOf(int shortRun, int longRun) {
+    const char* asked = std::getenv("KEST_SOAK");
+    return asked && std::string(asked) == "full" ? longRun : shortRun;
 }
 
 void test_ui::swipeAtRandom(Screen& screen, std::mt19937& random) {

@@ -30,6 +30,10 @@ private:
     int turns_ = 0;
 };
 
+/// How often to do something: the short run is part of every run of the tests, KEST_SOAK=full in the environment asks
+/// for the long one, of some minutes.
+int timesOf(int shortRun, int longRun);
+
 /// A finger's way from side to side across a screen 720 wide, fast or slow.
 void swipeAtRandom(Screen& screen, std::mt19937& random);
 
