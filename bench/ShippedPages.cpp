@@ -7,6 +7,7 @@
 #include "KestTipMarkup.h"
 
 #include <device/Device.h>
+#include <device/Keys.h>
 
 #include <fstream>
 #include <memory>
@@ -58,6 +59,8 @@ Page pageOf(const KestContentInfo& record) {
 std::vector<Page> shippedPages() {
     device::Device::setCurrent(std::make_unique<device::Device>(device::Device::Options::standard()));
     device::Device::current().setApplication({KEST_APP_ID, KEST_APP_ROOT});
+    // Its region has tips with pictures of every kind.
+    device::Device::current().settings().set(device::keys::country, "IN");
     if (!KestContentMgr::getInstance()->loadContentsList(true)) {
         throw std::runtime_error("the catalogue did not load");
     }
