@@ -35,7 +35,7 @@ private:
     void __setInfoArea(Evas_Object* pageLayout);
     void __setTitle(const KestContentInfo& record);
     void __setText(const KestContentInfo& record);
-    void __refreshTitleBar();
+    void __displayIfOpened();
     /// A copy of the page's record. False, with a line in the log, when a reload has left the page without one.
     bool __copyRecord(KestContentInfo& record) const;
     static void __launch(const KestContentInfo& record);

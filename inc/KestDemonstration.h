@@ -34,6 +34,9 @@ public:
     /// The same for a tall picture.
     void createButtonVertical(Evas_Object* imageLayout);
 
+    /// Whether a run has the reply button hidden.
+    bool replyHidden() const { return state != State::Idle; }
+
     /// Ends it where it is; the pictures stay as they are.
     void stop();
     /// Ends it and starts over from the first picture.
@@ -42,9 +45,7 @@ public:
     void reset();
 
 private:
-    /// The one place where the state changes, and with it whether the button is hidden.
-    void __enter(State next);
-    /// The same, and the next step comes after so many seconds, and again as long as steps return true.
+    /// The next step comes after so many seconds, and again as long as steps return true.
     void __enter(State next, double seconds);
     void __press();
     void __releaseSequence();
@@ -67,6 +68,4 @@ private:
     State state;
     /// The one pending timer.
     app_assist::WUiTimer::Handle timer;
-    /// 1 while a run has the reply button hidden.
-    int replyHidden;
 };

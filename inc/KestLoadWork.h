@@ -32,7 +32,6 @@ public:
 
 private:
     bool __take(std::uint64_t& left, std::uint64_t amount);
-    void __lookAtClock();
 
     KestProcessorTime time;
     // More than a 32-bit device can count in a size_t.
@@ -40,6 +39,4 @@ private:
     std::uint64_t detailTextBytes;
     std::uint64_t fileBytes;
     std::uint64_t keptBytes;
-    std::uint64_t workSinceLook;
-    bool isLate;
 };

@@ -6,8 +6,15 @@
 class KestProcessorTime {
 public:
     explicit KestProcessorTime(std::int64_t seconds);
-    bool isOver() const;
+
+    /// Looks at the clock.
+    bool isOver();
+    /// The same after work of so many bytes more, but looks only once in a while: a look takes as long as handling a
+    /// short text.
+    bool isOverAfter(std::uint64_t bytes);
 
 private:
     std::int64_t end;
+    std::uint64_t workSinceLook;
+    bool wasOver;
 };

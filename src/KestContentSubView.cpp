@@ -181,7 +181,7 @@ void KestContentSubView::__launch(const KestContentInfo& record) {
     app_control_destroy(request);
 }
 
-void KestContentSubView::__refreshTitleBar() {
+void KestContentSubView::__displayIfOpened() {
     if (index == displayIndex) {
         onViewDisplay(getNaviItem());
     }
@@ -198,7 +198,7 @@ void KestContentSubView::__themeChangedCb(void* data) try {
     if (view->titleLabel && view->__copyRecord(record)) {
         view->__setTitle(record);
     }
-    view->__refreshTitleBar();
+    view->__displayIfOpened();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }
@@ -217,7 +217,7 @@ void KestContentSubView::__languageChangedCb(void* data, Evas_Object*, void*) tr
             if (view->entry && view->__copyRecord(record)) {
                 view->__setText(record);
             }
-            view->__refreshTitleBar();
+            view->__displayIfOpened();
             return false;
         },
         view, view->layout);

@@ -31,7 +31,7 @@ void onSignal(Evas_Object* layout, const char* signal, Edje_Signal_Cb callback, 
 }  // namespace
 
 KestDemonstration::KestDemonstration(KestPictureArea& pictureArea, app_assist::WView& pageView)
-    : area(pictureArea), view(pageView), state(State::Idle), replyHidden(0) {}
+    : area(pictureArea), view(pageView), state(State::Idle) {}
 
 KestDemonstration::~KestDemonstration() {
     app_assist::WUiTimer::destroy(timer);
@@ -49,7 +49,7 @@ void KestDemonstration::createButtonVertical(Evas_Object* imageLayout) {
 
 void KestDemonstration::stop() {
     app_assist::WUiTimer::destroy(timer);
-    __enter(State::Idle);
+    state = State::Idle;
 }
 
 void KestDemonstration::restart() {
@@ -71,14 +71,9 @@ void KestDemonstration::reset() {
     area.hideTouchMarkers();
 }
 
-void KestDemonstration::__enter(State next) {
-    state = next;
-    replyHidden = state == State::Idle ? 0 : 1;
-}
-
 void KestDemonstration::__enter(State next, double seconds) {
     app_assist::WUiTimer::destroy(timer);
-    __enter(next);
+    state = next;
     timer = app_assist::WUiTimer::addTimer(
         seconds, [this](app_assist::WView*) { return __step(); }, &view, area.imageLayout);
 }
@@ -88,7 +83,7 @@ void KestDemonstration::__press() {
         return;
     }
     area.emit("reply,hide");
-    if (replyHidden == 0) {
+    if (!replyHidden()) {
         area.emit("reply,press,show");
     }
 }
@@ -147,7 +142,7 @@ bool KestDemonstration::__advance() {
     if (area.hasTouchMarker(page + 1)) {
         __enter(State::Waiting, secondsToTouch);
     } else {
-        __enter(State::Advancing);
+        state = State::Advancing;
     }
     return true;
 }
@@ -157,7 +152,7 @@ bool KestDemonstration::__scroll() {
         return __scrollBack();
     }
     area.bringIn(area.extraHeight);
-    __enter(State::ScrollingBack);
+    state = State::ScrollingBack;
     return true;
 }
 
@@ -172,7 +167,7 @@ bool KestDemonstration::__scrollBack() {
 }
 
 void KestDemonstration::__end() {
-    __enter(State::Idle);
+    state = State::Idle;
     area.hideTouchMarkers();
     area.emit("reply,show");
 }

@@ -14,32 +14,21 @@ const std::uint64_t leastText = 4096;
 
 const std::int64_t longestSeconds = 10;
 
-/// Looking at the clock takes as long as handling a short text, so it waits until there was work of so many bytes.
-const std::uint64_t workBetweenLooks = 128 * 1024;
-
 }  // namespace
 
 KestLoadWork::KestLoadWork()
     : time(longestSeconds), textBytes(mostText), detailTextBytes(mostTextOfDetail), fileBytes(mostFiles),
-      keptBytes(mostKept), workSinceLook(0), isLate(false) {}
+      keptBytes(mostKept) {}
 
 bool KestLoadWork::__take(std::uint64_t& left, std::uint64_t amount) {
-    workSinceLook += leastText + amount;
-    if (workSinceLook >= workBetweenLooks) {
-        __lookAtClock();
-    }
+    const bool isLate = time.isOverAfter(leastText + amount);
     const bool enough = amount <= left && !isLate;
     left = enough ? left - amount : 0;
     return enough;
 }
 
-void KestLoadWork::__lookAtClock() {
-    workSinceLook = 0;
-    isLate = time.isOver();
-}
-
 void KestLoadWork::beginDetail() {
-    __lookAtClock();
+    time.isOver();
     detailTextBytes = mostTextOfDetail;
 }
 

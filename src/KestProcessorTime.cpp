@@ -5,6 +5,7 @@
 namespace {
 
 const std::int64_t nanosecondsOfSecond = 1000000000;
+const std::uint64_t workBetweenLooks = 64 * 1024;
 
 std::int64_t now() {
     timespec time{};
@@ -14,8 +15,16 @@ std::int64_t now() {
 
 }  // namespace
 
-KestProcessorTime::KestProcessorTime(std::int64_t seconds) : end(now() + seconds * nanosecondsOfSecond) {}
+KestProcessorTime::KestProcessorTime(std::int64_t seconds)
+    : end(now() + seconds * nanosecondsOfSecond), workSinceLook(0), wasOver(false) {}
 
-bool KestProcessorTime::isOver() const {
-    return now() >= end;
+bool KestProcessorTime::isOver() {
+    workSinceLook = 0;
+    wasOver = now() >= end;
+    return wasOver;
+}
+
+bool KestProcessorTime::isOverAfter(std::uint64_t bytes) {
+    workSinceLook += bytes;
+    return workSinceLook >= workBetweenLooks ? isOver() : wasOver;
 }

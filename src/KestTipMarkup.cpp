@@ -33,11 +33,14 @@ bool writeNumbers(const std::string& format, const std::array<int, 2>& numbers, 
             continue;
         }
         const Placeholder* placeholder = placeholderAt(format, at);
-        const size_t index = !placeholder || placeholder->index >= 0 ? 0 : next++;
-        if (!placeholder || index >= numbers.size()) {
+        if (!placeholder) {
             return false;
         }
-        text += std::to_string(numbers.at(placeholder->index < 0 ? index : static_cast<size_t>(placeholder->index)));
+        const size_t index = placeholder->index < 0 ? next++ : static_cast<size_t>(placeholder->index);
+        if (index >= numbers.size()) {
+            return false;
+        }
+        text += std::to_string(numbers.at(index));
         at += std::string(placeholder->text).size();
     }
     return true;

@@ -23,9 +23,6 @@ const size_t mostMessageBytes = 16 * 1024 * 1024;
 /// thousands of different names, each takes longer than the one before.
 const std::int64_t mostSeconds = 3;
 
-/// A file of an ordinary catalogue is parsed in less time than many looks at the clock take.
-const size_t bytesBetweenLooks = 64 * 1024;
-
 /// What reading an element or a reference costs beside its text, in bytes of text.
 const size_t costOfNode = 16;
 
@@ -40,19 +37,9 @@ struct Source {
     size_t at;
     /// As if the text ended here.
     bool isCut;
-    size_t nextLook;
-    /// Begins at the first look.
-    std::unique_ptr<const KestProcessorTime> time;
+    KestProcessorTime time;
 };
 Source* source = nullptr;
-
-void lookAtClock(Source& from) {
-    if (!from.time) {
-        from.time.reset(new KestProcessorTime(mostSeconds));
-    }
-    from.nextLook += bytesBetweenLooks;
-    from.isCut = from.isCut || from.time->isOver();
-}
 
 int __isForParser(const char*) {
     return source ? 1 : 0;
@@ -64,10 +51,7 @@ void* __openText(const char*) {
 
 int __readText(void* context, char* buffer, int length) {
     auto* from = static_cast<Source*>(context);
-    if (from->at >= from->nextLook) {
-        lookAtClock(*from);
-    }
-    if (from->isCut) {
+    if (from->isCut || from->time.isOverAfter(static_cast<std::uint64_t>(length))) {
         return 0;
     }
     const size_t count = from->text.copy(buffer, static_cast<size_t>(length), from->at);
@@ -90,7 +74,8 @@ bool giveTextsToParser() {
 /// While it exists the parser reads `text` and keeps its messages, which would go to standard error, to itself.
 class Parsing {
 public:
-    explicit Parsing(const std::string& text) : current{text, 0, false, bytesBetweenLooks, nullptr}, messageBytes(0) {
+    explicit Parsing(const std::string& text)
+        : current{text, 0, false, KestProcessorTime(mostSeconds)}, messageBytes(0) {
         static const bool given = giveTextsToParser();
         source = given ? &current : nullptr;
         xmlSetStructuredErrorFunc(this, __dropMessage);

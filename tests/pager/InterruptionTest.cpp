@@ -117,14 +117,20 @@ TEST_P(Interruption, ByAChangeOfTheThemeStartsOver) {
     EXPECT_THAT(calls::story(), testing::ElementsAreArray(beginning()));
 }
 
-using InterruptedTallPicture = PagerTest;
+class InterruptedTallPicture : public PagerTest {
+protected:
+    /// Opens it, with a page that stands still behind it.
+    void play(double seconds) {
+        drawPicture("a_01.png", 716, 900);
+        drawPicture("plain.png");
+        writeTips({tip("a_01.png"), tip("plain.png")});
+        open();
+        test_ui::runFor(seconds);
+    }
+};
 
 TEST_F(InterruptedTallPicture, IsScrolledBackByASwipe) {
-    drawPicture("a_01.png", 716, 900);
-    drawPicture("plain.png");
-    writeTips({tip("a_01.png"), tip("plain.png")});
-    open();
-    test_ui::runFor(3);
+    play(3);
     ASSERT_EQ(scrolledTo(), 245);
     calls::forget();
     swipe();
@@ -135,11 +141,7 @@ TEST_F(InterruptedTallPicture, IsScrolledBackByASwipe) {
 }
 
 TEST_F(InterruptedTallPicture, AtItsTopStaysThereAtASwipe) {
-    drawPicture("a_01.png", 716, 900);
-    drawPicture("plain.png");
-    writeTips({tip("a_01.png"), tip("plain.png")});
-    open();
-    test_ui::runFor(1);
+    play(1);
     calls::forget();
     swipe();
     test_ui::runFor(20);
@@ -148,11 +150,7 @@ TEST_F(InterruptedTallPicture, AtItsTopStaysThereAtASwipe) {
 }
 
 TEST_F(InterruptedTallPicture, GetsItsButtonBackByASwipe) {
-    drawPicture("a_01.png", 716, 900);
-    drawPicture("plain.png");
-    writeTips({tip("a_01.png"), tip("plain.png")});
-    open();
-    test_ui::runFor(0.5);
+    play(0.5);
     swipe();
     test_ui::runFor(1);
     calls::forget();
@@ -161,11 +159,7 @@ TEST_F(InterruptedTallPicture, GetsItsButtonBackByASwipe) {
 }
 
 TEST_F(InterruptedTallPicture, StartsOverWhenASwipeComesBack) {
-    drawPicture("a_01.png", 716, 900);
-    drawPicture("plain.png");
-    writeTips({tip("a_01.png"), tip("plain.png")});
-    open();
-    test_ui::runFor(3);
+    play(3);
     swipe();
     test_ui::runFor(1);
     swipe(-1);

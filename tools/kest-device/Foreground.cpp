@@ -52,9 +52,9 @@ Moment momentOf(const std::string& time) {
     return static_cast<double>(timegm(&parts)) + fraction;
 }
 
-Moment lastHandOver(Session& session, const std::string& id) {
+Moment lastHandOver(const std::vector<device::LaunchRecord>& launches, const std::string& id) {
     Moment last = 0;
-    for (const device::LaunchRecord& record : session.device().launches().all()) {
+    for (const device::LaunchRecord& record : launches) {
         if (record.request.appId == id && record.outcome == device::LaunchOutcome::HandedOver) {
             last = std::max(last, momentOf(record.time));
         }
@@ -69,9 +69,10 @@ const RunningApplication& inFront(Session& session, const std::vector<RunningApp
     if (running.size() == 1) {
         return *front;
     }
+    const std::vector<device::LaunchRecord> launches = session.device().launches().all();
     Moment latest = -1;
     for (const RunningApplication& application : running) {
-        const Moment launched = std::max(startOf(application.process), lastHandOver(session, application.id));
+        const Moment launched = std::max(startOf(application.process), lastHandOver(launches, application.id));
         if (launched > latest) {
             latest = launched;
             front = &application;
