@@ -163,6 +163,18 @@ TEST_F(ApplicationStart, ThatThrowsEndsWithStatusOne) {
     EXPECT_EQ(1, status_);
 }
 
+TEST_F(ApplicationStart, WhoseDatabaseWasReplacedByWhatIsNoneEndsWithStatusOne) {
+    const std::filesystem::path file = device_->database().file();
+    const support::Environment same("KEST_DEVICE", device_.root().string());
+    std::filesystem::rename(file, file.string() + ".damaged");
+    std::filesystem::create_directory(file);
+    EXPECT_EQ("error: " + file.string() +
+                  ": is not a file; move it away, and the device begins with a fresh database\n",
+              begin());
+    EXPECT_EQ(1, status_);
+    EXPECT_THAT(app_.story, IsEmpty());
+}
+
 TEST_F(Application, RunsAtTheRootWithItsToolkitsFilesInTheDevice) {
     support::Environment unusable("XDG_RUNTIME_DIR", "/no/such/folder");
     RunningApp running(app_);

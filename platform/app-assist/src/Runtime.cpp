@@ -137,6 +137,8 @@ std::optional<int> Runtime::claimInstance() {
                 return std::nullopt;
             // It was set aside before the lock told that an application uses it. A device is opened without the lock.
             instance_.reset();
+            // The old one goes first, and there may be none then.
+            device_ = nullptr;
             device_ = &device::Device::reopenCurrent();
         } else if (const auto status = handOver()) {
             return status;
