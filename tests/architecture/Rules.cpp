@@ -86,6 +86,7 @@ const std::map<std::string, Layer>& layers() {
         {"capi", {{"device"}, false}},
         {"log-client", {{"device", "capi"}, false}},
         {"efl-answers", {{"device"}, true}},
+        {"notifier", {{"device", "efl-answers"}, false}},
         {"ui-extension", {{"device", "capi", "log-client"}, true}},
         {"remote-control", {{"device", "capi", "log-client"}, true}},
         {"app-assist", {{"device", "capi", "log-client", "efl-answers", "ui-extension", "remote-control"}, true}},
@@ -114,7 +115,8 @@ bool isDeviceHeader(const std::string& header) {
         R"(app-assist/W(App|AppEventHandler|Naviframe|PageSlideView|UIObject|UiTimer|View|)"
         R"(Window)\.h)");
     static const std::regex services(
-        R"((app_(common|control|extension|manager|preference|resource_manager)|bundle|dlog|package_(info|manager)|)"
+        R"((app_(common|control|extension|manager|preference|resource_manager)|bundle|dlog|notification|)"
+        R"(package_(info|manager)|)"
         R"(ravella-log-client|system_settings|tizen_error|ui_extension|vconf)\.h)");
     return std::regex_match(header, framework) || std::regex_match(header, services);
 }

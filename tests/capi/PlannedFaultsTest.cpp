@@ -5,6 +5,7 @@
 #include "app_resource_manager.h"
 #include "bundle.h"
 #include "dlog.h"
+#include "notification.h"
 #include "package_manager.h"
 #include "ravella-log-client.h"
 #include "support/TemporaryDevice.h"
@@ -38,6 +39,7 @@ struct Arguments {
     package_info_h lookedUp = nullptr;
     package_manager_h packages = nullptr;
     ravella_log_manager_h usage = nullptr;
+    notification_h notification = nullptr;
     std::string callbacks;
 
     Arguments() {
@@ -46,6 +48,8 @@ struct Arguments {
         package_info_create("com.example.app", &info);
         package_manager_create(&packages);
         ravella_log_manager_create(&usage);
+        notification = notification_create(NOTIFICATION_TYPE_NOTI);
+        app_control_set_app_id(request, "com.example.app");
     }
     ~Arguments() {
         device::faults::clear();
@@ -54,6 +58,7 @@ struct Arguments {
         package_info_destroy(info);
         package_manager_destroy(packages);
         ravella_log_manager_destroy(usage);
+        notification_free(notification);
     }
     Arguments(const Arguments&) = delete;
     Arguments& operator=(const Arguments&) = delete;
@@ -107,6 +112,24 @@ const Service services[] = {
          return a.callbacks.empty() ? planned : 0;
      }},
     {"dlog_print", [](Arguments&) { return dlog_print(DLOG_INFO, "TAG", "text") == -1 ? planned : 0; }},
+    {"notification_create", [](Arguments&) { return codeOf(notification_create(NOTIFICATION_TYPE_NOTI)); }},
+    {"notification_free", [](Arguments& a) { return notification_free(a.notification); }},
+    {"notification_set_layout",
+     [](Arguments& a) { return notification_set_layout(a.notification, NOTIFICATION_LY_NOTI_EVENT_SINGLE); }},
+    {"notification_set_text",
+     [](Arguments& a) {
+         return notification_set_text(a.notification, NOTIFICATION_TEXT_TYPE_TITLE, "text", "key",
+                                      NOTIFICATION_VARIABLE_TYPE_NONE);
+     }},
+    {"notification_set_image",
+     [](Arguments& a) { return notification_set_image(a.notification, NOTIFICATION_IMAGE_TYPE_ICON, "/icon.png"); }},
+    {"notification_set_launch_option",
+     [](Arguments& a) {
+         return notification_set_launch_option(a.notification, NOTIFICATION_LAUNCH_OPTION_APP_CONTROL, a.request);
+     }},
+    {"notification_set_display_applist",
+     [](Arguments& a) { return notification_set_display_applist(a.notification, NOTIFICATION_DISPLAY_APP_ALL); }},
+    {"notification_post", [](Arguments& a) { return notification_post(a.notification); }},
     {"package_info_create", [](Arguments& a) { return package_info_create("com.example.app", &a.lookedUp); }},
     {"package_manager_get_package_info",
      [](Arguments& a) { return package_manager_get_package_info("com.example.app", &a.lookedUp); }},
@@ -144,7 +167,7 @@ TEST_P(PlannedFault, StrikesTheServiceOfItsName) {
 
 /// The functions that a public header declares.
 std::set<std::string> declaredIn(const std::filesystem::path& header) {
-    static const std::regex declaration("^(?:int|void|char\\*|void\\*|bundle\\*) ([a-z_]+)\\(");
+    static const std::regex declaration("^(?:int|void|char\\*|void\\*|bundle\\*|notification_h) ([a-z_]+)\\(");
     std::set<std::string> names;
     std::istringstream lines(support::readFile(header));
     std::smatch match;

@@ -37,7 +37,7 @@ TEST(Database, IsWrittenAheadAndCarriesTheVersionOfItsSchema) {
     EXPECT_EQ(sql.execAndGet("PRAGMA journal_mode").getString(), "wal");
     EXPECT_EQ(sql.execAndGet("PRAGMA synchronous").getInt(), 1);
     EXPECT_EQ(sql.execAndGet("PRAGMA busy_timeout").getInt(), 5000);
-    EXPECT_EQ(sql.execAndGet("PRAGMA user_version").getInt(), 2);
+    EXPECT_EQ(sql.execAndGet("PRAGMA user_version").getInt(), 3);
 }
 
 TEST(Database, IsItsUsersAloneInAFolderThatEverybodyReads) {
@@ -114,7 +114,7 @@ TEST(Database, OfANewerVersionIsLeftAlone) {
     device->database().sql().exec("PRAGMA user_version = 7");
     EXPECT_EQ(messageOf([&] { device.reopen(); }),
               device.root().string() +
-                  "/device.db: was made by a newer version of this software (schema 7, this one knows 2); use that "
+                  "/device.db: was made by a newer version of this software (schema 7, this one knows 3); use that "
                   "version, or another folder with KEST_DEVICE");
     SQLite::Database untouched((device.root() / "device.db").string());
     EXPECT_EQ(untouched.execAndGet("PRAGMA user_version").getInt(), 7);

@@ -30,6 +30,16 @@ INSERT INTO usage (time, uri, record) VALUES ('2026-01-31T12:00:00.000Z', 'conte
 PRAGMA user_version = 1;
 )";
 
+/// What the second version added to it.
+constexpr char secondSchema[] = R"(
+CREATE TABLE launch (
+    id INTEGER PRIMARY KEY AUTOINCREMENT, time TEXT NOT NULL, caller TEXT NOT NULL, app_id TEXT NOT NULL,
+    extras TEXT NOT NULL, outcome TEXT NOT NULL, reason TEXT NOT NULL);
+INSERT INTO launch (time, caller, app_id, extras, outcome, reason)
+    VALUES ('2026-02-01T12:00:00.000Z', 'com.example.app', 'com.example.tea', '{"page":"walk"}', 'started', '');
+PRAGMA user_version = 2;
+)";
+
 /// A device that an earlier build has made.
 class OldDevice : public testing::Test {
 protected:
@@ -56,7 +66,20 @@ TEST_F(OldDevice, IsTakenOverWithAllThatItHas) {
     EXPECT_EQ(device.usage().all().size(), 1U);
     EXPECT_THAT(device.launches().all(), IsEmpty());
     EXPECT_EQ(device.launches().append({"a.a", "b.b", {}}, device::LaunchOutcome::Started), 1);
-    EXPECT_EQ(version(), 2);
+    EXPECT_THAT(device.notifications().all(), IsEmpty());
+    EXPECT_EQ(version(), 3);
+}
+
+TEST_F(OldDevice, OfTheSecondVersionIsTakenOverWithItsLaunches) {
+    SQLite::Database((root() / "device.db").string(), SQLite::OPEN_READWRITE).exec(secondSchema);
+    Device device(options());
+    EXPECT_THAT(device.settings().all(), ElementsAre(Pair("db/menu_widget/language", "ko_KR.UTF-8")));
+    ASSERT_EQ(device.launches().all().size(), 1U);
+    EXPECT_EQ(device.launches().all()[0].request.appId, "com.example.tea");
+    device::Notification notification;
+    notification.appId = "com.example.app";
+    EXPECT_EQ(device.notifications().append(notification), 1);
+    EXPECT_EQ(version(), 3);
 }
 
 TEST_F(OldDevice, IsTakenOverOnce) {
@@ -82,6 +105,7 @@ TEST_F(OldDevice, StaysAsItIsWhereTheDiskBecomesFullAtAnyMoment) {
     EXPECT_GT(failures, 5);
     EXPECT_EQ(Device(options()).usage().all().size(), 1U);
     EXPECT_EQ(Device(options()).launches().all().size(), 0U);
+    EXPECT_EQ(Device(options()).notifications().all().size(), 0U);
 }
 
 TEST_F(OldDevice, ThatLacksATableIsSetAside) {

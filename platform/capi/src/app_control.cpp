@@ -1,8 +1,6 @@
-#include "app_control.h"
-
+#include "AppControl.h"
 #include "Service.h"
 
-#include <map>
 #include <memory>
 
 namespace {
@@ -22,11 +20,6 @@ int codeOf(device::Launcher::Result result) {
 }
 
 }  // namespace
-
-struct app_control_s {
-    std::string appId;
-    std::map<std::string, std::string> extras;
-};
 
 int app_control_create(app_control_h* app_control) {
     return service::call("app_control_create", [&]() -> int {

@@ -40,14 +40,15 @@ Device::Options withFolder(Device::Options options) {
 }  // namespace
 
 Device::Options Device::Options::standard() {
-    return {Folder::resolve(), {DEVICE_PREINSTALLED_DIR}, DEVICE_DATA_DIR};
+    return {Folder::resolve(), {DEVICE_PREINSTALLED_DIR}, DEVICE_DATA_DIR, Database::Check::Quick, DEVICE_NOTIFIER};
 }
 
 Device::Device(Options options)
     : options_(withFolder(std::move(options))), database_(options_.folder, options_.check),
       settings_(database_, events_), preferences_(database_),
       packages_(database_, events_, options_.folder, options_.preinstalled), usage_(database_), launches_(database_),
-      log_(options_.folder.log()), launcher_(*this) {}
+      notifications_(database_), log_(options_.folder.log()), presenter_(options_.folder, log_, options_.notifier),
+      launcher_(*this) {}
 
 Device::~Device() = default;
 

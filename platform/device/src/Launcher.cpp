@@ -159,6 +159,11 @@ void Launcher::reapChildren() {
             childEnded(child.process.id(), *how, *how == endWithStatus(0));
 }
 
+bool Launcher::isWaiting() {
+    reapChildren();
+    return !children_.empty();
+}
+
 void Launcher::childEnded(int process, const std::string& how, bool well) {
     const auto found = std::find_if(children_.begin(), children_.end(),
                                     [&](const Child& child) { return child.process.id() == process; });

@@ -32,6 +32,14 @@ CREATE TABLE launch (
     extras TEXT NOT NULL, outcome TEXT NOT NULL, reason TEXT NOT NULL);
 )",
      5},
+    {R"(
+CREATE TABLE notification (
+    id INTEGER PRIMARY KEY AUTOINCREMENT, time TEXT NOT NULL, app_id TEXT NOT NULL, layout INTEGER NOT NULL,
+    places INTEGER NOT NULL, title TEXT NOT NULL, title_id TEXT NOT NULL, content TEXT NOT NULL,
+    content_id TEXT NOT NULL, icon TEXT NOT NULL, indicator_icon TEXT NOT NULL, launch_app_id TEXT NOT NULL,
+    launch_extras TEXT NOT NULL);
+)",
+     6},
 };
 static_assert(std::size(steps) == schemaVersion);
 
@@ -61,7 +69,7 @@ bool hasTablesOf(SQLite::Database& sql, int version) {
     if (version < 1 || version > schemaVersion)
         return false;
     const int tables = sql.execAndGet("SELECT count(*) FROM sqlite_schema WHERE type = 'table' AND name IN "
-                                      "('setting', 'preference', 'package', 'usage', 'launch')")
+                                      "('setting', 'preference', 'package', 'usage', 'launch', 'notification')")
                            .getInt();
     return tables == steps[version - 1].tables;
 }

@@ -5,7 +5,7 @@
 namespace device {
 
 /// The schema's version that this build writes and reads. It takes over a database of an older one.
-inline constexpr int schemaVersion = 2;
+inline constexpr int schemaVersion = 3;
 
 /// Whether nothing has been stored yet, not even a table.
 bool isFresh(SQLite::Database& sql);

@@ -7,8 +7,10 @@
 #include "device/Launcher.h"
 #include "device/Launches.h"
 #include "device/Log.h"
+#include "device/Notifications.h"
 #include "device/Packages.h"
 #include "device/Preferences.h"
+#include "device/Presenter.h"
 #include "device/Screen.h"
 #include "device/Settings.h"
 #include "device/Usage.h"
@@ -30,6 +32,8 @@ public:
         /// The platform's own data: locale/ and the theme.
         std::filesystem::path data;
         Database::Check check = Database::Check::Quick;
+        /// Shows a notification on the desktop, for the Presenter.
+        std::filesystem::path notifier = {};
 
         /// What the environment and the build say.
         static Options standard();
@@ -58,6 +62,8 @@ public:
     Packages& packages() { return packages_; }
     Usage& usage() { return usage_; }
     Launches& launches() { return launches_; }
+    Notifications& notifications() { return notifications_; }
+    Presenter& presenter() { return presenter_; }
     Launcher& launcher() { return launcher_; }
     Log& log() { return log_; }
 
@@ -84,7 +90,9 @@ private:
     Packages packages_;
     Usage usage_;
     Launches launches_;
+    Notifications notifications_;
     Log log_;
+    Presenter presenter_;
     Launcher launcher_;
     std::unique_ptr<Application> application_;
     mutable const Screen* screen_ = nullptr;

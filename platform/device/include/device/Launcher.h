@@ -40,6 +40,10 @@ public:
     /// starting. Throws Error when the device cannot be read.
     Result launch(const LaunchRequest& request);
 
+    /// Whether a program runs that it has started. What comes of a launch is known when that has ended, or after the
+    /// 10 seconds within which an end is a failure to start.
+    bool isWaiting();
+
 private:
     /// A process that this one started for a request.
     struct Child {

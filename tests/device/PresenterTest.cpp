@@ -1,0 +1,98 @@
+#include "device/Presenter.h"
+
+#include "support/Environment.h"
+#include "support/TemporaryDevice.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <sys/wait.h>
+
+namespace {
+
+using device::Presenter;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+/// Another program stands in for the one that shows notifications.
+class Presenting : public testing::Test {
+protected:
+    ~Presenting() override {
+        presenter_.takeAllDown();
+        while (waitpid(-1, nullptr, 0) > 0) {
+        }
+    }
+    std::vector<long long> shown() const {
+        std::vector<long long> ids;
+        for (const Presenter::Shown& each : presenter_.shown())
+            ids.push_back(each.id);
+        return ids;
+    }
+    static std::string environmentOf(const device::Process& process) {
+        return support::readFile("/proc/" + std::to_string(process.id()) + "/environ");
+    }
+
+    support::TemporaryDevice device_;
+    Presenter presenter_{device_->folder(), device_->log(), WAITING_PROGRAM};
+};
+
+TEST_F(Presenting, StartsAProgramForEachNotification) {
+    presenter_.show(12);
+    presenter_.show(3);
+    EXPECT_THAT(shown(), ElementsAre(3, 12));
+    EXPECT_THAT(presenter_.shown()[0].process.arguments(), ElementsAre(WAITING_PROGRAM, device_.root().string(), "3"));
+    EXPECT_THAT(device_.logMessages(), IsEmpty());
+}
+
+TEST_F(Presenting, TellsTheProgramTheDeviceAndNoneOfThePlannedFailures) {
+    const support::Environment faults("DEVICE_FAULTS", "vconf_get_str=-1");
+    presenter_.show(1);
+    const std::string environment = environmentOf(presenter_.shown().at(0).process);
+    EXPECT_THAT(environment, HasSubstr("KEST_DEVICE=" + device_.root().string() + '\0'));
+    EXPECT_THAT(environment, HasSubstr(std::string("DEVICE_FAULTS=\0", 15)));
+}
+
+TEST_F(Presenting, TakesOneDown) {
+    presenter_.show(1);
+    presenter_.show(2);
+    presenter_.takeDown(1);
+    EXPECT_THAT(shown(), ElementsAre(2));
+    presenter_.takeDown(4711);
+    EXPECT_THAT(shown(), ElementsAre(2));
+}
+
+TEST_F(Presenting, TakesAllDownAndSaysWhichTheyWere) {
+    presenter_.show(2);
+    presenter_.show(1);
+    EXPECT_THAT(presenter_.takeAllDown(), ElementsAre(1, 2));
+    EXPECT_THAT(shown(), IsEmpty());
+    EXPECT_THAT(presenter_.takeAllDown(), IsEmpty());
+}
+
+TEST_F(Presenting, LeavesOtherDevicesAndOtherProgramsAlone) {
+    const device::Folder folder(device_.folder() / "other");
+    Presenter others(folder, device_->log(), WAITING_PROGRAM);
+    others.show(1);
+    Presenter elsewhere(device_->folder(), device_->log(), "/usr/bin/something-else");
+    presenter_.show(1);
+    EXPECT_THAT(elsewhere.shown(), IsEmpty());
+    EXPECT_THAT(presenter_.takeAllDown(), ElementsAre(1));
+    EXPECT_THAT(others.takeAllDown(), ElementsAre(1));
+}
+
+TEST_F(Presenting, WithoutAProgramShowsNothing) {
+    Presenter none(device_->folder(), device_->log(), "");
+    none.show(1);
+    EXPECT_THAT(none.shown(), IsEmpty());
+    EXPECT_THAT(device_.logMessages(), IsEmpty());
+}
+
+TEST_F(Presenting, SaysWhyTheProgramCannotBeStarted) {
+    Presenter missing(device_->folder(), device_->log(), "/nowhere/shows");
+    missing.show(7);
+    EXPECT_THAT(device_.logMessages(), ElementsAre("E NOTIFICATION notification 7: not shown on the desktop: cannot "
+                                                   "start /nowhere/shows: No such file or directory"));
+}
+
+}  // namespace
