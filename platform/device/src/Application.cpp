@@ -3,6 +3,8 @@
 #include "device/Error.h"
 #include "device/Packages.h"
 
+#include <utility>
+
 namespace device {
 
 Application Application::ofThisProcess() {
@@ -11,7 +13,8 @@ Application Application::ofThisProcess() {
     if (error)
         throw Error("/proc/self/exe: " + error.message() + "; mount /proc");
     const std::filesystem::path root = executable.parent_path().parent_path();
-    return {readManifest(root).id, root};
+    Package package = readManifest(root);
+    return {std::move(package.id), root, std::move(package.link)};
 }
 
 }  // namespace device

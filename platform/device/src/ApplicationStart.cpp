@@ -2,6 +2,7 @@
 
 #include "device/Error.h"
 #include "device/Folder.h"
+#include "device/OneLine.h"
 #include "device/Packages.h"
 
 #include <fcntl.h>
@@ -24,15 +25,6 @@ Descriptor openOutput(const Folder& folder, const std::string& appId, bool keep)
     if (output)
         fcntl(output.get(), F_SETFL, O_APPEND);
     return output;
-}
-
-std::string oneLine(const std::string& text) {
-    std::string line;
-    for (const char character : text) {
-        const auto byte = static_cast<unsigned char>(character);
-        line += byte < ' ' || byte == 0x7f ? ' ' : character;
-    }
-    return line.size() > longestWords ? line.substr(0, longestWords) + "..." : line;
 }
 
 }  // namespace
@@ -64,7 +56,7 @@ std::string lastWordsOf(const Folder& folder, const std::string& appId) {
     for (std::string line; std::getline(stream, line);)
         if (!line.empty())
             last = line;
-    return oneLine(last);
+    return oneLine(last, longestWords);
 }
 
 }  // namespace device

@@ -155,6 +155,10 @@ const Folder& Bus::folder() const {
     return link_->folder;
 }
 
+const std::string& Bus::address() const {
+    return link_->address.text;
+}
+
 bool Bus::isPrivate() const {
     return link_->address.isPrivate;
 }

@@ -22,6 +22,8 @@ Message newCall(const std::string& destination, const std::string& path, const s
     Message call(dbus_message_new_method_call(destination.c_str(), path.c_str(), interface.c_str(), method.c_str()));
     if (!call)
         throw std::bad_alloc();
+    // Whoever asks an application that runs does not mean to start one that has just ended.
+    dbus_message_set_auto_start(call.get(), FALSE);
     return call;
 }
 

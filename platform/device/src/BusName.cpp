@@ -3,6 +3,7 @@
 #include "BlockingConnection.h"
 #include "device/Bus.h"
 #include "device/Error.h"
+#include "device/OneLine.h"
 
 #include <algorithm>
 #include <tuple>
@@ -24,6 +25,39 @@ Message aboutName(const char* method, const std::string& name) {
     const char* text = name.c_str();
     dbus_message_append_args(call.get(), DBUS_TYPE_STRING, &text, DBUS_TYPE_INVALID);
     return call;
+}
+
+bool isDigit(char character) {
+    return character >= '0' && character <= '9';
+}
+
+bool isAllowed(char character) {
+    return isDigit(character) || (character >= 'a' && character <= 'z') || (character >= 'A' && character <= 'Z') ||
+           character == '-' || character == '_';
+}
+
+/// The whole character of UTF-8 that begins there, as people are told of it.
+std::string characterAt(std::string_view text, std::size_t begin) {
+    std::size_t end = begin + 1;
+    while (end < text.size() && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80)
+        ++end;
+    const auto byte = static_cast<unsigned char>(text[begin]);
+    const bool isControl = byte < ' ' || byte == 0x7f;
+    return isControl ? "a control character" : '"' + std::string(text.substr(begin, end - begin)) + '"';
+}
+
+std::string faultOfPart(std::string_view part, std::size_t number) {
+    const std::string which = "part " + std::to_string(number) + " of it";
+    if (part.empty())
+        return which + " is empty";
+    const std::string shown = which + ", \"" + oneLine(std::string(part), part.size()) + "\",";
+    if (isDigit(part.front()))
+        return shown + " begins with a digit";
+    const auto wrong = std::find_if_not(part.begin(), part.end(), isAllowed);
+    if (wrong == part.end())
+        return "";
+    return shown + " holds " + characterAt(part, static_cast<std::size_t>(wrong - part.begin())) +
+           "; only letters, digits, \"-\" and \"_\" may stand there";
 }
 
 }  // namespace
@@ -94,6 +128,23 @@ bool BusName::isValid(std::string_view name) {
     const std::string text(name);
     return text.find('\0') == std::string::npos && text.rfind(':', 0) != 0 &&
            dbus_validate_bus_name(text.c_str(), nullptr) != 0;
+}
+
+std::string BusName::faultOf(std::string_view name) {
+    if (isValid(name))
+        return "";
+    if (name.empty())
+        return "it is empty";
+    if (name.size() > DBUS_MAXIMUM_NAME_LENGTH)
+        return "it is longer than 255 characters";
+    std::size_t number = 0;
+    for (std::size_t begin = 0; begin <= name.size(); ++number) {
+        const std::size_t end = std::min(name.find('.', begin), name.size());
+        if (std::string fault = faultOfPart(name.substr(begin, end - begin), number + 1); !fault.empty())
+            return fault;
+        begin = end + 1;
+    }
+    return number < 2 ? "it has no dot; it needs two or more parts, joined by dots" : "the bus does not take it";
 }
 
 }  // namespace device

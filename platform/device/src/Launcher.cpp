@@ -1,6 +1,5 @@
 #include "device/Launcher.h"
 
-#include "Utf8.h"
 #include "device/ApplicationLock.h"
 #include "device/ApplicationStart.h"
 #include "device/Device.h"
@@ -22,35 +21,12 @@ using namespace std::chrono_literals;
 constexpr auto databasePatience = 250ms;
 /// An application that fails later than that was started all right.
 constexpr auto startTime = 10s;
-constexpr std::size_t mostBytes = 64 * 1024;
-/// What an extra costs beside its text, where it is passed on.
-constexpr std::size_t bytesOfExtra = 8;
 /// No id of an application is longer.
 constexpr std::size_t longestId = 255;
 
-std::size_t sizeOf(const LaunchRequest& request) {
-    std::size_t size = request.appId.size();
-    for (const auto& [key, value] : request.extras)
-        size += key.size() + value.size() + bytesOfExtra;
-    return size;
-}
-
-/// Why the request cannot be passed on as KEY=VALUE words and over a bus; "" when it can.
-std::string faultOf(const LaunchRequest& request) {
-    if (sizeOf(request) > mostBytes)
-        return "the request is larger than 64 KiB";
-    for (const auto& [key, value] : request.extras) {
-        if (!isUtf8(key) || !isUtf8(value))
-            return "the extra \"" + key + "\" is not UTF-8";
-        if (key.find('=') != std::string::npos)
-            return "the extra \"" + key + "\" has a \"=\" in its name";
-    }
-    return "";
-}
-
 /// As much of it as a record holds.
 LaunchRequest shortened(LaunchRequest request) {
-    if (sizeOf(request) > mostBytes) {
+    if (request.size() > LaunchRequest::mostBytes) {
         request.extras.clear();
         request.appId = request.appId.substr(0, longestId);
     }

@@ -140,6 +140,21 @@ std::string pathBelow(const std::filesystem::path& folder, const std::string& na
     return (folder / relative).string();
 }
 
+/// How links lead into the application: <metadata key="link" value="SCHEME:{NAME}{?NAME,NAME}"/>.
+void readLink(Package& package, xmlNode* application, const std::filesystem::path& file) {
+    for (xmlNode* child = application->children; child; child = child->next) {
+        if (nameOf(child) != "metadata" || attributeOf(child, "key") != "link")
+            continue;
+        if (package.link)
+            fail(file, xmlGetLineNo(child), "there is a second form of links; an application has one");
+        try {
+            package.link.emplace(attributeOf(child, "value"));
+        } catch (const Error& fault) {
+            fail(file, xmlGetLineNo(child), fault.what());
+        }
+    }
+}
+
 void readApplication(Package& package, xmlNode* application, const std::filesystem::path& file) {
     const long line = xmlGetLineNo(application);
     const std::string id = attributeOf(application, "appid");
@@ -148,6 +163,7 @@ void readApplication(Package& package, xmlNode* application, const std::filesyst
              "the application's id \"" + id + "\" differs from the package's, \"" + package.id +
                  "\"; they must be equal");
     readLabels(package, application);
+    readLink(package, application, file);
     package.exec = pathBelow(package.root / "bin", attributeOf(application, "exec"), file, line);
     if (xmlNode* icon = childNamed(application, "icon"))
         package.icon = pathBelow(package.root / "shared/res", trimmed(stringOf(Text(xmlNodeGetContent(icon)))), file,

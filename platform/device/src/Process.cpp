@@ -27,6 +27,15 @@ fs::path procFolder(int id) {
     return fs::path("/proc") / std::to_string(id);
 }
 
+/// The kernel ends each with a zero byte.
+std::vector<std::string> textsIn(const fs::path& file) {
+    std::ifstream stream(file, std::ios::binary);
+    std::vector<std::string> texts;
+    for (std::string text; std::getline(stream, text, '\0');)
+        texts.push_back(text);
+    return texts;
+}
+
 std::vector<std::string> environmentWith(const std::vector<std::pair<std::string, std::string>>& changes) {
     std::vector<std::string> all;
     for (char** entry = environ; *entry; ++entry) {
@@ -90,12 +99,14 @@ bool Process::runs() const {
 }
 
 std::vector<std::string> Process::arguments() const {
-    std::ifstream stream(procFolder(id_) / "cmdline", std::ios::binary);
-    std::vector<std::string> words;
-    // The kernel ends each with a zero byte.
-    for (std::string word; std::getline(stream, word, '\0');)
-        words.push_back(word);
-    return words;
+    return textsIn(procFolder(id_) / "cmdline");
+}
+
+std::optional<std::string> Process::variable(const std::string& name) const {
+    for (const std::string& text : textsIn(procFolder(id_) / "environ"))
+        if (text.starts_with(name + "="))
+            return text.substr(name.size() + 1);
+    return std::nullopt;
 }
 
 bool Process::endsWithin(std::chrono::milliseconds time) const {

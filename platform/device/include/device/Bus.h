@@ -42,6 +42,9 @@ public:
     Eldbus_Connection* connection() const;
     const Folder& folder() const;
 
+    /// Where its daemon listens.
+    const std::string& address() const;
+
     /// Whether it is the device's private bus, not the session bus.
     bool isPrivate() const;
 

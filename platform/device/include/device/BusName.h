@@ -34,6 +34,8 @@ public:
     /// Whether the text can be a well-known name: two or more elements, joined by dots, of letters, digits, '-'
     /// and '_', none of which begins with a digit; at most 255 characters.
     static bool isValid(std::string_view name);
+    /// Why it cannot, and which part of it is wrong, as "part 2 of it is empty"; "" when it can.
+    static std::string faultOf(std::string_view name);
 };
 
 }  // namespace device

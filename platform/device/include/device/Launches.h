@@ -1,19 +1,13 @@
 #pragma once
 
+#include "device/LaunchRequest.h"
+
 #include <string>
-#include <utility>
 #include <vector>
 
 namespace device {
 
 class Database;
-
-/// What one application asks another for.
-struct LaunchRequest {
-    std::string caller;  ///< who asks: an application's id
-    std::string appId;   ///< who is asked
-    std::vector<std::pair<std::string, std::string>> extras;
-};
 
 /// What has come of a launch request.
 enum class LaunchOutcome {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "device/Link.h"
+
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -24,6 +26,7 @@ struct Package {
     std::map<std::string, std::string> labels;
     std::string icon;            ///< absolute path of the icon; empty when the manifest names none
     std::string exec;            ///< absolute path of the executable; empty when the manifest names none
+    std::optional<Link> link;    ///< how links lead into the application; none: no link does
     std::filesystem::path root;  ///< the package's folder; shared resources are in root/shared/res/
     bool preinstalled = false;   ///< true: part of the build; false: installed on this device
 
@@ -34,7 +37,8 @@ struct Package {
 
 /// Reads `<root>/tizen-manifest.xml`.
 /// Throws Error, naming file and line, when it is missing, no regular file, not well formed, lacks the package
-/// id, gives an application id that differs from the package id, or an id that is no valid bus name.
+/// id, gives an application id that differs from the package id, an id that is no valid bus name, or a form of links
+/// that is none.
 Package readManifest(const std::filesystem::path& root);
 
 /// The packages of the device: those that the build ships, read where they lie, as changed by what was

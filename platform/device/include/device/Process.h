@@ -21,6 +21,8 @@ public:
     bool runs() const;
     /// Its words, the program's name first; empty when they cannot be told.
     std::vector<std::string> arguments() const;
+    /// A variable of the environment that it was started with; nullopt when it had none, or cannot be asked.
+    std::optional<std::string> variable(const std::string& name) const;
 
     /// Whether it ended within that time.
     bool endsWithin(std::chrono::milliseconds time) const;

@@ -49,16 +49,19 @@ inline bool runLoopUntil(const std::function<bool()>& done,
 class PrivateBus {
 public:
     /// `isSession`: whether DBUS_SESSION_BUS_ADDRESS names it; otherwise that is not set at all. `authentication`:
-    /// EXTERNAL lets this user in, anything else refuses him.
-    explicit PrivateBus(bool isSession = true, const std::string& authentication = "EXTERNAL")
+    /// EXTERNAL lets this user in, anything else refuses him. `services`: a folder of service files, by which the
+    /// daemon starts programs, with this process's environment.
+    explicit PrivateBus(bool isSession = true, const std::string& authentication = "EXTERNAL",
+                        const std::string& services = "")
         : socket_((folder_.path() / "bus").string()),
           session_("DBUS_SESSION_BUS_ADDRESS", isSession ? std::optional(address()) : std::nullopt) {
         const std::string configuration = (folder_.path() / "bus.conf").string();
         writeFile(configuration, "<!DOCTYPE busconfig PUBLIC \"-//freedesktop//DTD D-Bus Bus Configuration 1.0//EN\" "
                                  "\"http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd\">\n"
                                  "<busconfig><type>session</type><listen>" +
-                                     address() + "</listen><auth>" + authentication +
-                                     "</auth><policy context=\"default\">"
+                                     address() + "</listen><auth>" + authentication + "</auth>" +
+                                     (services.empty() ? "" : "<servicedir>" + services + "</servicedir>") +
+                                     "<policy context=\"default\">"
                                      "<allow send_destination=\"*\" eavesdrop=\"true\"/><allow eavesdrop=\"true\"/>"
                                      "<allow own=\"*\"/></policy></busconfig>\n");
         daemon_ = std::make_unique<Process>(
