@@ -14,6 +14,8 @@ constexpr char sharedResources[] = KEST_APP_ROOT "/shared/res/";
 constexpr char locale[] = KEST_APP_ROOT "/res/locale";
 /// The system's gettext catalogues.
 constexpr char systemLocale[] = "/usr/share/locale";
+/// The application's icon among those that the quick panel keeps for notifications.
+constexpr char notificationIcon[] = "/usr/apps/com.ravella.quickpanel/shared/res/noti_icons/Kest/noti_kest.png";
 
 }  // namespace kest_paths
 

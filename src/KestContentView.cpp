@@ -74,7 +74,7 @@ Elm_Object_Item* KestContentView::onPushToNaviframe(Evas_Object* naviframe) {
     WASSERT(getEvasObj() != nullptr);
     elm_object_item_part_content_unset(getNaviItem(), "title_left_btn");
     Evas_Object* back = KestCommon::createButton(naviframe, "naviframe/back_btn/default", nullptr, __backCb, this);
-    if (pushOnTop) {
+    if (pushOnTop || !elm_naviframe_top_item_get(naviframe)) {
         return elm_naviframe_item_push(naviframe, nullptr, back, nullptr, getEvasObj(), nullptr);
     }
     return elm_naviframe_item_insert_after(naviframe, elm_naviframe_top_item_get(naviframe), nullptr, back, nullptr,

@@ -67,11 +67,12 @@ void KestMainView::onDestroy() {
 
 Elm_Object_Item* KestMainView::onPushToNaviframe(Evas_Object* naviframe) {
     WASSERT(getEvasObj() != nullptr);
-    if (pushOnTop) {
+    // Beneath all pagers, where a launch request opened several.
+    Elm_Object_Item* lowest = elm_naviframe_bottom_item_get(naviframe);
+    if (pushOnTop || !lowest) {
         return elm_naviframe_item_push(naviframe, nullptr, nullptr, nullptr, getEvasObj(), nullptr);
     }
-    return elm_naviframe_item_insert_before(naviframe, elm_naviframe_top_item_get(naviframe), nullptr, nullptr, nullptr,
-                                            getEvasObj(), nullptr);
+    return elm_naviframe_item_insert_before(naviframe, lowest, nullptr, nullptr, nullptr, getEvasObj(), nullptr);
 }
 
 void KestMainView::onPushed(Elm_Object_Item* naviItem) {

@@ -32,6 +32,10 @@ void KestUsageLog::menuChosen(const std::string& menuTitle) {
     insertRecord("KT01", &menuTitle);
 }
 
+void KestUsageLog::menuRequested(const std::string& menuTitle) {
+    insertRecord("KT03", &menuTitle);
+}
+
 void KestUsageLog::replyPressed() {
     insertRecord("KT02", nullptr);
 }
