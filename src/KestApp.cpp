@@ -230,8 +230,8 @@ void KestApp::__addKestNotification() {
         return;
     }
     notification_set_layout(notification, NOTIFICATION_LY_NOTI_EVENT_SINGLE);
-    notification_set_text(notification, NOTIFICATION_TEXT_TYPE_TITLE, "Kests", "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME",
-                          NOTIFICATION_VARIABLE_TYPE_NONE);
+    notification_set_text(notification, NOTIFICATION_TEXT_TYPE_TITLE, "Kests",
+                          "IDS_KESTS_BODY_KESTS_M_APPLICATION_NAME", NOTIFICATION_VARIABLE_TYPE_NONE);
     notification_set_text(notification, NOTIFICATION_TEXT_TYPE_CONTENT, "Discover useful features here.",
                           "IDS_KESTS_SBODY_DISCOVER_USEFUL_FEATURES_HERE_ABB", NOTIFICATION_VARIABLE_TYPE_NONE);
     __setNotificationImages(notification);
@@ -249,8 +249,7 @@ void KestApp::__addKestNotification() {
 void KestApp::__setNotificationImages(notification_h notification) {
     KestPlatformString path;
     app_resource_manager_get(APP_RESOURCE_TYPE_IMAGE, "images/noti_kest.png", path.out());
-    const int indicator =
-        notification_set_image(notification, NOTIFICATION_IMAGE_TYPE_ICON_FOR_INDICATOR, path.get());
+    const int indicator = notification_set_image(notification, NOTIFICATION_IMAGE_TYPE_ICON_FOR_INDICATOR, path.get());
     if (indicator != NOTIFICATION_ERROR_NONE) {
         KEST_ERR("Fail to notification_set_image(indicator) : %d", indicator);
     }
