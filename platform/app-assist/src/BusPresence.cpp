@@ -5,6 +5,7 @@
 #include <device/BusCall.h>
 #include <device/BusName.h>
 #include <device/Error.h>
+#include <device/HandOver.h>
 
 #include <chrono>
 #include <filesystem>
@@ -46,6 +47,11 @@ BusPresence::BusPresence(device::Device& device, remote_control::Server::Applica
 
 BusPresence::~BusPresence() {
     leave();
+}
+
+void BusPresence::requireStartingBus() const {
+    if (bus_)
+        device::requireStartingBus(*bus_);
 }
 
 // The names come last, the device's last of all: who finds one owned can ask its owner at once.

@@ -26,6 +26,8 @@ public:
     BusPresence& operator=(const BusPresence&) = delete;
 
     Result result() const { return result_; }
+    /// Throws device::Error when this process was started by another bus than the one that it is on.
+    void requireStartingBus() const;
     /// The folder of the device that has the bus, where that is another one.
     const std::string& otherFolder() const { return otherFolder_; }
 

@@ -1,19 +1,38 @@
 #include "LaunchRequest.h"
 
+#include <device/OneLine.h>
+
 #include <stdexcept>
+#include <string_view>
 
 namespace app_assist {
 
-LaunchRequest::Extras LaunchRequest::parse(int argc, const char* const* argv) {
-    Extras extras;
+namespace {
+
+constexpr std::string_view activation = "--dbus-activated";
+constexpr std::size_t longestShown = 200;
+
+}  // namespace
+
+LaunchRequest::Words LaunchRequest::parse(int argc, const char* const* argv) {
+    if (argc > 1 && argv[1] == activation) {
+        if (argc > 2)
+            throw std::invalid_argument(std::string(activation) +
+                                        " goes without extras: the launch request comes over the bus");
+        return {{}, true};
+    }
+    device::LaunchRequest request;
     for (int i = 1; i < argc; ++i) {
         const std::string word = argv[i];
         const auto equals = word.find('=');
         if (equals == std::string::npos || equals == 0)
-            throw std::invalid_argument("'" + word + "' is no extra of a launch request: write KEY=VALUE");
-        extras.emplace_back(word.substr(0, equals), word.substr(equals + 1));
+            throw std::invalid_argument("'" + device::oneLine(word, longestShown) +
+                                        "' is no extra of a launch request: write KEY=VALUE");
+        request.extras.emplace_back(word.substr(0, equals), word.substr(equals + 1));
     }
-    return extras;
+    if (const std::string fault = device::faultOf(request); !fault.empty())
+        throw std::invalid_argument(fault);
+    return {std::move(request.extras), false};
 }
 
 LaunchRequest::LaunchRequest(const std::string& appId, const Extras& extras) {

@@ -2,20 +2,26 @@
 
 #include <app_control.h>
 
+#include <device/LaunchRequest.h>
+
 #include <string>
-#include <utility>
-#include <vector>
 
 namespace app_assist {
 
 /// A launch request to this application: its extras, and the handle that the application reads them from.
 class LaunchRequest {
 public:
-    using Extras = std::vector<std::pair<std::string, std::string>>;
+    using Extras = device::Extras;
 
-    /// From the KEY=VALUE words of a command line, the program's name left out.
-    /// Throws std::invalid_argument, whose what() is a line for people, for a word that is none.
-    static Extras parse(int argc, const char* const* argv);
+    /// What the words of a command line say of the first request.
+    struct Words {
+        Extras extras;
+        bool comesOverTheBus = false;  ///< it is yet to come: who asks has started this process by way of the bus
+    };
+    /// From KEY=VALUE words, or "--dbus-activated" alone, the program's name left out.
+    /// Throws std::invalid_argument, whose what() is a line for people, for other words, and for extras that nobody can
+    /// pass on.
+    static Words parse(int argc, const char* const* argv);
 
     LaunchRequest(const std::string& appId, const Extras& extras);
     ~LaunchRequest();

@@ -26,6 +26,9 @@ namespace app_assist {
 
 namespace {
 
+/// The bus delivers what it has started the application for at once; a busy machine may take its time.
+constexpr double secondsForRequest = 10;
+
 void say(const std::string& line) {
     std::fprintf(stderr, "%s: %s\n", program_invocation_short_name, line.c_str());
 }
@@ -54,7 +57,7 @@ Runtime::~Runtime() {
 
 std::optional<int> Runtime::begin(int argc, char** argv) {
     try {
-        extras_ = LaunchRequest::parse(argc, argv);
+        words_ = LaunchRequest::parse(argc, argv);
     } catch (const std::invalid_argument& error) {
         device::sayErrorOnce(error.what());
         return 2;
@@ -71,7 +74,7 @@ std::optional<int> Runtime::begin(int argc, char** argv) {
         if (const auto status = joinBus())
             return status;
         catchUp();
-        queueFirstRequest();
+        words_.comesOverTheBus ? awaitRequest() : queueFirstRequest();
         return std::nullopt;
     } catch (const std::exception& error) {
         device::sayErrorOnce(error.what());
@@ -103,11 +106,15 @@ bool Runtime::createApplication(int argc, char** argv) {
 }
 
 std::optional<int> Runtime::joinBus() {
-    const auto launch = [this](const LaunchRequest::Extras& extras) { deliver(extras); };
+    const auto launch = [this](const LaunchRequest::Extras& extras) { deliverFromBus(extras); };
     try {
-        presence_.emplace(*device_,
-                          remote_control::Server::Application{[this] { return window(); }, [] { elm_exit(); }, launch});
+        presence_.emplace(*device_, remote_control::Server::Application{[this] { return window(); }, [] { elm_exit(); },
+                                                                        launch, device_->application().link});
+        if (words_.comesOverTheBus)
+            presence_->requireStartingBus();
     } catch (const device::Error& error) {
+        if (words_.comesOverTheBus)
+            throw;
         say(std::string(error.what()) + "; remote control is off");
         return std::nullopt;
     }
@@ -120,6 +127,8 @@ std::optional<int> Runtime::joinBus() {
         presence_.reset();
         return handOver().value_or(1);
     case BusPresence::Result::NoBus:
+        if (words_.comesOverTheBus)
+            throw device::Error("there is no bus, so the launch request cannot come");
         say("there is no bus: remote control is off");
         return std::nullopt;
     case BusPresence::Result::Joined:
@@ -149,7 +158,9 @@ std::optional<int> Runtime::claimInstance() {
 std::optional<int> Runtime::handOver() {
     const std::string& id = device_->application().id;
     try {
-        if (!device::handOver(device_->folder(), id, extras_))
+        const bool taken = words_.comesOverTheBus ? device::waitOnStartingBus(device_->folder(), id)
+                                                  : device::handOver(device_->folder(), id, words_.extras);
+        if (!taken)
             return std::nullopt;
         say(id + " is running already");
         return 0;
@@ -168,9 +179,36 @@ void Runtime::queueFirstRequest() {
     // first frame has what the request asked for, and no empty one is waited for.
     firstRequest_ = ecore_idle_enterer_before_add(
         [](void* data) -> Eina_Bool {
-            auto* self = static_cast<Runtime*>(data);
-            self->firstRequest_ = nullptr;
-            guarded("a launch request", [self] { self->deliver(self->extras_); });
+            static_cast<Runtime*>(data)->deliverFirst();
+            return ECORE_CALLBACK_CANCEL;
+        },
+        this);
+}
+
+void Runtime::deliverFirst() {
+    firstRequest_ = nullptr;
+    guarded("a launch request", [this] { deliver(words_.extras); });
+}
+
+void Runtime::deliverFromBus(const LaunchRequest::Extras& extras) {
+    // None overtakes the one that the application was started with.
+    if (firstRequest_) {
+        ecore_idle_enterer_del(firstRequest_);
+        deliverFirst();
+    }
+    if (patience_)
+        ecore_timer_del(std::exchange(patience_, nullptr));
+    deliver(extras);
+}
+
+void Runtime::awaitRequest() {
+    patience_ = ecore_timer_add(
+        secondsForRequest,
+        [](void* data) -> Eina_Bool {
+            static_cast<Runtime*>(data)->patience_ = nullptr;
+            dlog_print(DLOG_WARN, logTag, "no launch request has come within %g s of the start by the bus; the end",
+                       secondsForRequest);
+            elm_exit();
             return ECORE_CALLBACK_CANCEL;
         },
         this);
@@ -231,6 +269,8 @@ void Runtime::useTheme() {
 void Runtime::end() {
     if (firstRequest_)
         ecore_idle_enterer_del(std::exchange(firstRequest_, nullptr));
+    if (patience_)
+        ecore_timer_del(std::exchange(patience_, nullptr));
     app_.endSight();
     if (std::exchange(created_, false))
         guarded("onTerminate", [this] { app_.onTerminate(); });

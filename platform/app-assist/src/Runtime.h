@@ -23,8 +23,8 @@ public:
     Runtime(const Runtime&) = delete;
     Runtime& operator=(const Runtime&) = delete;
 
-    /// Everything up to the main loop, which then delivers the first launch request. nullopt when the main loop may
-    /// run, else the process's exit status; why is said on standard error.
+    /// Everything up to the main loop, which then delivers the first launch request, or waits for it on the bus.
+    /// nullopt when the main loop may run, else the process's exit status; why is said on standard error.
     std::optional<int> begin(int argc, char** argv);
     void end();
 
@@ -38,6 +38,10 @@ private:
     /// The exit status of a second process; nullopt when the first has ended meanwhile.
     std::optional<int> handOver();
     void queueFirstRequest();
+    void deliverFirst();
+    void deliverFromBus(const LaunchRequest::Extras& extras);
+    /// The application ends when the request does not come that it was started for.
+    void awaitRequest();
     void deliver(const LaunchRequest::Extras& extras);
     void raiseWindow() const;
     /// The application's; null when there is none.
@@ -60,8 +64,9 @@ private:
     /// The language and the theme that are in use.
     std::string language_;
     bool isDark_ = false;
-    LaunchRequest::Extras extras_;
+    LaunchRequest::Words words_;
     Ecore_Idle_Enterer* firstRequest_ = nullptr;
+    Ecore_Timer* patience_ = nullptr;
     bool created_ = false;
     bool firstLaunch_ = true;
 };

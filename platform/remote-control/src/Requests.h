@@ -1,5 +1,6 @@
 #pragma once
 
+#include "device/Bus.h"
 #include "device/Error.h"
 
 #include <Eldbus.h>
@@ -18,6 +19,18 @@ struct MessageUnref {
 /// EFL hands requests out as const; keeping one changes nothing but its counter.
 inline std::shared_ptr<Eldbus_Message> keep(const Eldbus_Message* request) {
     return {eldbus_message_ref(const_cast<Eldbus_Message*>(request)), MessageUnref()};
+}
+
+/// Exports an interface of the application's object. Throws device::Error when the bus does not take it.
+inline Eldbus_Service_Interface* offer(const device::Bus& bus, const std::string& appId,
+                                       const Eldbus_Service_Interface_Desc& description) {
+    const std::string path = device::bus::pathOf(appId);
+    Eldbus_Service_Interface* interface =
+        eldbus_service_interface_register(bus.connection(), path.c_str(), &description);
+    if (!interface) {
+        throw device::Error("cannot offer " + path + " on the device's bus");
+    }
+    return interface;
 }
 
 /// The answer that `work` makes, or an error with what it threw.

@@ -3,6 +3,7 @@
 #include "ActionQueue.h"
 #include "ApplicationService.h"
 #include "Condition.h"
+#include "DesktopService.h"
 #include "Element.h"
 #include "Input.h"
 #include "Requests.h"
@@ -28,8 +29,9 @@ using Steps = std::function<std::vector<Playback::Step>(Evas* canvas)>;
 
 struct Server::State {
     State(device::Bus& deviceBus, const std::string& id, Application asked)
-        : bus(deviceBus), appId(id), window(std::move(asked.window)),
-          application(deviceBus, id, std::move(asked.quit), std::move(asked.launch)),
+        : bus(deviceBus), appId(id), window(std::move(asked.window)), requests(deviceBus, id, std::move(asked.launch)),
+          application(deviceBus, id, std::move(asked.quit), requests),
+          desktop(deviceBus, id, std::move(asked.link), requests),
           actions([this] { return evas_object_evas_get(requireWindow()); }) {}
     ~State();
 
@@ -47,7 +49,9 @@ struct Server::State {
     device::Bus& bus;
     const std::string appId;
     const std::function<Evas_Object*()> window;
+    LaunchQueue requests;
     ApplicationService application;
+    DesktopService desktop;
     ActionQueue actions;
     Eldbus_Service_Interface* screen = nullptr;
 };
@@ -73,11 +77,7 @@ void Server::State::exportObject() {
         {}};
     static const Eldbus_Service_Interface_Desc screenDescription = {
         device::bus::screenInterface, screenMethods, nullptr, nullptr, nullptr, nullptr};
-    const std::string path = device::bus::pathOf(appId);
-    screen = eldbus_service_interface_register(bus.connection(), path.c_str(), &screenDescription);
-    if (!screen) {
-        throw device::Error("cannot offer " + path + " on the device's bus");
-    }
+    screen = offer(bus, appId, screenDescription);
     eldbus_service_object_data_set(screen, stateKey, this);
 }
 

@@ -2,11 +2,12 @@
 
 #include <Elementary.h>
 
+#include "device/Link.h"
+
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
-#include <utility>
-#include <vector>
 
 namespace device {
 class Bus;
@@ -15,19 +16,21 @@ class Bus;
 namespace remote_control {
 
 /// Lets other processes see and drive the screen of this application: the D-Bus object
-/// `/<application id, dots as slashes>` with the interfaces com.ravella.device.Application and
-/// com.ravella.device.Screen. It answers from the main loop and never blocks it.
+/// `/<application id, dots as slashes>` with the interfaces com.ravella.device.Application, org.freedesktop.Application
+/// and com.ravella.device.Screen. It answers from the main loop and never blocks it.
 /// It asks for no bus name: that is for whoever runs the application.
 class Server {
 public:
-    using Extras = std::vector<std::pair<std::string, std::string>>;
+    using Extras = device::Extras;
     using LaunchHandler = std::function<void(const Extras&)>;
 
     /// What the server asks of the application, from the main loop.
     struct Application {
         std::function<Evas_Object*()> window;  ///< its window at that time, null when there is none
         std::function<void()> quit;            ///< after the caller of Quit() was answered
-        LaunchHandler launch = {};  ///< after the caller of Launch() was answered; none: it takes no such requests
+        /// A launch request, after the caller was answered; none: it takes no such requests.
+        LaunchHandler launch = {};
+        std::optional<device::Link> link = {};  ///< how links lead into it; none: it opens no links
     };
 
     /// Exports the object on `bus`, which must outlive the server.
