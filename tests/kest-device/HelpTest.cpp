@@ -16,7 +16,7 @@ TEST_P(Help, OfACommandIsAsItWasWritten) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Commands, Help,
-                         testing::Values("start", "stop", "status", "reset", "get", "set", "unset", "install",
+                         testing::Values("start", "launch", "stop", "status", "reset", "get", "set", "unset", "install",
                                          "uninstall", "packages", "clear", "preferences", "usage", "launches", "log",
                                          "tree", "tap", "swipe", "key", "wait-for", "screenshot"),
                          [](const auto& information) {

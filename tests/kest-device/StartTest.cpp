@@ -222,7 +222,7 @@ TEST_F(StartRefused, WithoutADisplay) {
 
 TEST_F(StartRefused, WhenItIsNotInstalled) {
     EXPECT_EQ(run({"start", "--headless", "--", "com.example.none"}),
-              failed("com.example.none is not installed; 'kest-device packages' lists what is"));
+              failed("com.example.none is not installed; what is: " + installed()));
 }
 
 TEST_F(StartRefused, WhenItsProgramIsMissing) {

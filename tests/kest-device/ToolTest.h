@@ -14,6 +14,14 @@ class ToolTest : public testing::Test {
 protected:
     Result run(const std::vector<std::string>& words) { return device_.run(words); }
     std::string root() const { return device_.root().string(); }
+    /// The ids of what is installed, as messages list them.
+    std::string installed() const {
+        std::string ids;
+        for (const device::Package& package : device_.open().packages().all()) {
+            ids += (ids.empty() ? "" : ", ") + package.id;
+        }
+        return ids;
+    }
 
     test_tool::TestDevice device_;
 };

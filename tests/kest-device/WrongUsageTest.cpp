@@ -54,11 +54,32 @@ TEST_F(WrongUsage, ExtrasThatAreNone) {
               wrongUsage("extras are written KEY=VALUE; \"page\" is not; see 'kest-device start --help'"));
     EXPECT_EQ(run({"start", "--headless", "--", "com.ravella.kest", "=1"}),
               wrongUsage("extras are written KEY=VALUE; \"=1\" is not; see 'kest-device start --help'"));
+    EXPECT_EQ(run({"launch", "com.ravella.kest", "page"}),
+              wrongUsage("extras are written KEY=VALUE; \"page\" is not; see 'kest-device launch --help'"));
+    EXPECT_EQ(run({"launch", "com.ravella.kest", "page=1", "page=2"}),
+              wrongUsage("the extra \"page\" is given twice; see 'kest-device launch --help'"));
+    EXPECT_EQ(run({"launch", "com.ravella.kest", "page=" + std::string(70000, '1')}),
+              wrongUsage("the request is larger than 64 KiB; see 'kest-device launch --help'"));
+    EXPECT_EQ(run({"launch"}), wrongUsage("request is required; see 'kest-device launch --help'"));
 }
 
 TEST_F(WrongUsage, AnApplicationIdThatIsNone) {
     EXPECT_EQ(run({"start", "--headless", "--", "../kest"}),
-              wrongUsage("\"../kest\" is no application id; see 'kest-device start --help'"));
+              wrongUsage("\"../kest\" is no application id: part 1 of it is empty; see 'kest-device start --help'"));
+    EXPECT_EQ(run({"launch", "com..kest"}),
+              wrongUsage("\"com..kest\" is no application id: part 2 of it is empty; see 'kest-device launch --help'"));
+    EXPECT_EQ(run({"launch", "1com.kest"}),
+              wrongUsage("\"1com.kest\" is no application id: part 1 of it, \"1com\", begins "
+                         "with a digit; see 'kest-device launch --help'"));
+    EXPECT_EQ(
+        run({"tree", "--app", "com.ke$t"}),
+        wrongUsage("\"com.ke$t\" is no application id: part 2 of it, \"ke$t\", holds \"$\"; only letters, digits, "
+                   "\"-\" and \"_\" may stand there; see 'kest-device tree --help'"));
+    for (const char* command : {"uninstall", "clear", "preferences"})
+        EXPECT_EQ(run({command, "kest"}),
+                  wrongUsage("\"kest\" is no application id: it has no dot; it needs two or more "
+                             "parts, joined by dots; see 'kest-device " +
+                             std::string(command) + " --help'"));
 }
 
 TEST_F(WrongUsage, WordsThatAreNotUtf8) {

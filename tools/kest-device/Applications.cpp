@@ -66,6 +66,9 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
 }
 
 RunningApplication theOneMeant(Session& session, const std::string& id) {
+    if (!id.empty()) {
+        requireApplicationId(id);
+    }
     const std::vector<RunningApplication> running = runningApplications(session);
     if (id.empty() && running.empty()) {
         throw device::Error("no application runs on this device; start one with 'kest-device start'");
@@ -82,6 +85,12 @@ RunningApplication theOneMeant(Session& session, const std::string& id) {
 }
 
 }  // namespace
+
+void requireApplicationId(const std::string& id) {
+    if (const std::string fault = device::BusName::faultOf(id); !fault.empty()) {
+        throw UsageError('"' + id + "\" is no application id: " + fault);
+    }
+}
 
 std::string nameOf(const RunningApplication& application) {
     return application.id + " (process " + std::to_string(application.process.id()) + ")";

@@ -10,10 +10,12 @@
 #include <Ecore.h>
 #include <Efreet.h>
 
+#include <chrono>
 #include <cstdio>
 #include <cstdlib>
 #include <stdexcept>
 #include <string>
+#include <thread>
 #include <unistd.h>
 
 namespace {
@@ -33,7 +35,22 @@ std::string modeOf(int argc, char** argv) {
     return {};
 }
 
+/// Shows the title that a later request gives, or does amiss what that says.
+void take(const remote_control::Server::Extras& extras, const sample::SampleWindow& screen) {
+    for (const auto& [key, value] : extras) {
+        if (key == "title") {
+            screen.setTitle(value);
+        }
+        if (key == "mode" && value == "ends") {
+            elm_exit();
+        }
+    }
+}
+
 int run(const std::string& mode) {
+    if (mode == "ends") {
+        return 0;
+    }
     if (mode == "fails") {
         std::fputs("something to begin with\nthe fruits are rotten\n", stderr);
         return 3;
@@ -43,6 +60,9 @@ int run(const std::string& mode) {
     }
     device::Device& device = device::Device::current();
     const device::ApplicationLock lock(device.folder(), device.application().id);
+    if (mode == "slow") {
+        std::this_thread::sleep_for(std::chrono::seconds(1));
+    }
     Evas_Object* window = elm_win_add(nullptr, "sample", ELM_WIN_BASIC);
     if (!window) {
         throw std::runtime_error("no window");
@@ -64,7 +84,8 @@ int run(const std::string& mode) {
             elm_exit();
         }
     };
-    const remote_control::Server server(*bus, device.application().id, {[window] { return window; }, quit});
+    const auto launch = [&screen](const remote_control::Server::Extras& extras) { take(extras, screen); };
+    const remote_control::Server server(*bus, device.application().id, {[window] { return window; }, quit, launch});
     device::BusName::own(*bus, device.application().id, false);
     device::BusName::own(*bus, device::bus::deviceName, true);
     const auto subscription = device.events().onSetting([&](const std::string& key) {

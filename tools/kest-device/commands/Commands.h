@@ -9,6 +9,7 @@ namespace tool {
 // One function a command, each in the file of its name. It gives `app` the command with its options, its help and
 // what it does with the session; a failure is thrown.
 void addStart(CLI::App& app, Session& session);
+void addLaunch(CLI::App& app, Session& session);
 void addStop(CLI::App& app, Session& session);
 void addStatus(CLI::App& app, Session& session);
 void addReset(CLI::App& app, Session& session);

@@ -54,6 +54,7 @@ void install(Session& session, const std::string& source) {
 }
 
 void uninstall(Session& session, const std::string& id) {
+    requireApplicationId(id);
     requireNotRunning(session, id);
     session.connectedDevice().packages().uninstall(id);
     settle(session);

@@ -1,3 +1,4 @@
+#include "Applications.h"
 #include "Commands.h"
 #include "Output.h"
 #include "device/Error.h"
@@ -16,6 +17,7 @@ Example:
   kest-device clear com.ravella.kest)";
 
 void requireKnown(device::Device& device, const std::string& id) {
+    requireApplicationId(id);
     const std::vector<std::string> applications = device.preferences().applications();
     const bool hasStored = std::find(applications.begin(), applications.end(), id) != applications.end();
     if (!hasStored && !device.packages().rootOf(id)) {

@@ -3,12 +3,9 @@
 #include "FolderLock.h"
 #include "Launcher.h"
 #include "Output.h"
-#include "PrivateBus.h"
 #include "Settings.h"
-#include "device/BusName.h"
 #include "device/Error.h"
 
-#include <cstdlib>
 #include <iostream>
 
 namespace tool {
@@ -34,34 +31,6 @@ Examples:
   kest-device start --headless --screen 480x800
   kest-device start -- com.ravella.kest)";
 
-/// The id and the extras that the words after "--" give. Throws UsageError.
-LaunchRequest requestOf(const Options& options) {
-    LaunchRequest request;
-    request.headless = options.headless;
-    request.appId = options.request.empty() ? DEFAULT_APP_ID : options.request.front();
-    if (!device::BusName::isValid(request.appId)) {
-        throw UsageError('"' + request.appId + "\" is no application id");
-    }
-    for (std::size_t i = 1; i < options.request.size(); ++i) {
-        const std::size_t equals = options.request[i].find('=');
-        if (equals == 0 || equals == std::string::npos) {
-            throw UsageError("extras are written KEY=VALUE; \"" + options.request[i] + "\" is not");
-        }
-        request.extras.emplace_back(options.request[i].substr(0, equals), options.request[i].substr(equals + 1));
-    }
-    return request;
-}
-
-void requireDisplay(bool headless) {
-    const auto isSet = [](const char* name) {
-        const char* value = std::getenv(name);
-        return value && *value;
-    };
-    if (!headless && !isSet("DISPLAY") && !isSet("WAYLAND_DISPLAY") && !isSet("ELM_ENGINE")) {
-        throw device::Error("there is no display to open a window on; use --headless");
-    }
-}
-
 void requireNotRunning(Session& session, const std::string& id) {
     for (const RunningApplication& application : runningApplications(session)) {
         if (application.id == id) {
@@ -72,7 +41,9 @@ void requireNotRunning(Session& session, const std::string& id) {
 }
 
 void start(Session& session, const Options& options) {
-    const LaunchRequest request = requestOf(options);
+    LaunchRequest request =
+        requestOf(options.request.empty() ? std::vector<std::string>{DEFAULT_APP_ID} : options.request);
+    request.headless = options.headless;
     session.folder().create();
     const FolderLock lock(session.folder());
     device::Device& device = session.device();
@@ -82,31 +53,18 @@ void start(Session& session, const Options& options) {
     if (!options.screen.empty()) {
         storeSetting(device, "screen", options.screen);
     }
-
-    const bool startsBus = !session.bus();
-    if (startsBus) {
-        PrivateBus(session.folder()).start();
+    const std::optional<device::Process> process = startOnDevice(session, package, request);
+    if (!process) {
+        throw earlyEnd(session.folder(), request.appId, device::endWithStatus(0));
     }
-    try {
-        if (startsBus && !session.reconnect()) {
-            throw device::Error("the bus of the device does not answer");
-        }
-        requireOwnBus(session, *session.bus());
-        const device::Process process = launch(session, package, request);
-        if (options.json) {
-            print({{"application", request.appId},
-                   {"process", process.id()},
-                   {"headless", request.headless},
-                   {"folder", session.folder().root().string()}});
-        } else {
-            std::cout << request.appId << " runs" << (request.headless ? ", headless" : "") << " (process "
-                      << process.id() << ")\n";
-        }
-    } catch (...) {
-        if (startsBus) {
-            PrivateBus(session.folder()).stop();
-        }
-        throw;
+    if (options.json) {
+        print({{"application", request.appId},
+               {"process", process->id()},
+               {"headless", request.headless},
+               {"folder", session.folder().root().string()}});
+    } else {
+        std::cout << request.appId << " runs" << (request.headless ? ", headless" : "") << " (process " << process->id()
+                  << ")\n";
     }
 }
 
