@@ -1,13 +1,18 @@
 #include "device/Packages.h"
 
 #include "InstalledPackages.h"
+#include "RefusedRename.h"
 #include "support/Message.h"
 #include "support/Process.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <csignal>
+#include <functional>
 #include <random>
+#include <sys/time.h>
 
 namespace {
 
@@ -63,32 +68,78 @@ TEST_F(PackageRemoval, OfALinkLeavesWhereItLeads) {
     EXPECT_TRUE(std::filesystem::exists(tea / "tizen-manifest.xml"));
 }
 
-TEST_F(PackageRemoval, IsDoneWholeOrNotAtAllWhenItIsKilledAtAnyMoment) {
-    const auto update = makePackage("com.example.app", "4.0");
-    for (int number = 0; number < 40; ++number)
-        writeFile(update / ("res/" + std::to_string(number)), std::string(2000, 'x'));
-    std::mt19937 random(4711);
-    std::uniform_int_distribution<int> microseconds(0, 8000);
-    for (int round = 0; round < 60; ++round) {
-        packages.install(update);
-        device->database().sql().exec("DELETE FROM package");
-        auto remover = Process::ofWork([&] {
-            device::Device same(device.options());
-            same.packages().uninstall("com.example.app");
-            return 0;
-        });
-        // The moment is the point of this test: a real one, at random, while the remover runs.
-        usleep(static_cast<useconds_t>(microseconds(random)));
-        remover.end(SIGKILL);
-        const auto package = packages.find("com.example.app");
-        if (!package)
-            continue;
-        ASSERT_EQ(package->version, "4.0");
-        for (int number = 0; number < 40; ++number)
-            ASSERT_EQ(std::filesystem::file_size(package->root / ("res/" + std::to_string(number))), 2000U);
+TEST_F(PackageRemoval, ChangesNothingWhenTheFolderCannotBeMoved) {
+    packages.install(makePackage("com.example.app", "4.0"));
+    const auto root = device.root() / "opt/usr/apps/com.example.app";
+    {
+        const RefusedRename refused([&](const std::string& from) { return from == root; });
+        const std::string message = root.string() + ": cannot be removed: Permission denied; move it away by hand";
+        EXPECT_EQ(messageOf([&] { packages.uninstall("com.example.app"); }), message);
+        EXPECT_EQ(messageOf([&] { device::Packages::removeInstalled(device->folder()); }), message);
     }
-    packages.install(makePackage("com.example.other"));
+    EXPECT_EQ(packages.find("com.example.app")->version, "4.0");
     EXPECT_THAT(remains(), IsEmpty());
+}
+
+/// A removal that another process is killed in, at a moment of its own work: at random within a time that becomes
+/// shorter when it came too late, and longer when it came too early. So it comes both too late and too early, however
+/// fast the machine is.
+class KilledRemoval : public PackageRemoval {
+protected:
+    void SetUp() override {
+        for (int number = 0; number < 40; ++number)
+            writeFile(update_ / ("res/" + std::to_string(number)), std::string(2000, 'x'));
+    }
+    /// Has it done sixty times, always from two packages that are installed.
+    void repeat(const std::function<void(device::Packages&)>& removal) {
+        for (int round = 0; round < 60; ++round) {
+            packages.install(update_);
+            packages.install(tea_);
+            device->database().sql().exec("DELETE FROM package");
+            const int microseconds = std::uniform_int_distribution<int>(1, static_cast<int>(longest_) + 1)(random_);
+            const int status = Process::ofWork([&] {
+                                   device::Device same(device.options());
+                                   std::signal(SIGALRM, SIG_DFL);
+                                   const itimerval alarm{{0, 0}, {0, microseconds}};
+                                   setitimer(ITIMER_REAL, &alarm, nullptr);
+                                   removal(same.packages());
+                                   return 0;
+                               }).wait();
+            ASSERT_THAT(status, testing::AnyOf(0, -SIGALRM));
+            const bool removed = !std::filesystem::exists(device.root() / "opt/usr/apps/com.example.app");
+            longest_ = removed ? longest_ * 0.8 : std::min(longest_ * 1.25, 900000.0);
+            ++(removed ? removed_ : left_);
+            expectWholeOrGone("com.example.app");
+            expectWholeOrGone("com.example.tea");
+        }
+        EXPECT_GT(removed_, 0);
+        EXPECT_GT(left_, 0);
+        packages.install(makePackage("com.example.other"));
+        EXPECT_THAT(remains(), IsEmpty());
+    }
+    void expectWholeOrGone(const std::string& id) const {
+        const auto root = device.root() / "opt/usr/apps" / id;
+        if (!std::filesystem::exists(root))
+            return;
+        EXPECT_EQ(packages.find(id)->version, id == "com.example.app" ? "4.0" : "1.0.0");
+        for (int number = 0; id == "com.example.app" && number < 40; ++number)
+            EXPECT_EQ(std::filesystem::file_size(root / ("res/" + std::to_string(number))), 2000U);
+    }
+
+    const std::filesystem::path update_ = makePackage("com.example.app", "4.0");
+    const std::filesystem::path tea_ = makePackage("com.example.tea");
+    std::mt19937 random_{4711};
+    double longest_ = 4000;
+    int removed_ = 0;
+    int left_ = 0;
+};
+
+TEST_F(KilledRemoval, IsDoneWholeOrNotAtAll) {
+    repeat([](device::Packages& same) { same.uninstall("com.example.app"); });
+}
+
+TEST_F(KilledRemoval, OfAllThatIsInstalledLeavesEachWholeOrNotAtAll) {
+    repeat([this](device::Packages&) { device::Packages::removeInstalled(device::Folder(device.root())); });
 }
 
 }  // namespace

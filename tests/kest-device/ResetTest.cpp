@@ -1,10 +1,31 @@
 #include "ToolTest.h"
 
+#include "device/ApplicationLock.h"
+
+#include <fcntl.h>
+#include <future>
+#include <poll.h>
+#include <sys/file.h>
+
 namespace {
 
 namespace fs = std::filesystem;
 
-class Reset : public ToolTest {};
+class Reset : public ToolTest {
+protected:
+    /// Whether one of the device's processes has the file open.
+    bool isOpen(const fs::path& file) const {
+        for (const pid_t process : device_.processes()) {
+            std::error_code error;
+            for (const auto& entry : fs::directory_iterator("/proc/" + std::to_string(process) + "/fd", error)) {
+                if (fs::read_symlink(entry.path(), error) == file) {
+                    return true;
+                }
+            }
+        }
+        return false;
+    }
+};
 
 }  // namespace
 
@@ -44,4 +65,38 @@ TEST_F(Reset, HelpsWithADamagedDatabase) {
     EXPECT_EQ(run({"reset"}).status, 0);
 
     EXPECT_EQ(run({"get", "language"}), done("en_US\n"));
+}
+
+TEST_F(Reset, CuresWhatOneThatWasCutShortHasLeft) {
+    const fs::path apps = device_.root() / "opt/usr/apps";
+    const std::string before = device_.must({"packages"});
+    ASSERT_THAT(before, testing::HasSubstr("com.ravella.clock"));
+    support::writeFile(apps / "com.ravella.clock/shared/res/clock.png", "the rest of a package");
+    test_tool::makePackage(apps / ".removing-abcdef/com.example.game", "com.example.game", "1");
+    test_tool::makePackage(apps / ".installing-abcdef", "com.example.game", "1");
+
+    EXPECT_EQ(run({"packages"}), done(before));
+    device_.must({"reset"});
+
+    EXPECT_EQ(run({"packages"}), done(before));
+    EXPECT_FALSE(fs::exists(apps / ".removing-abcdef"));
+    EXPECT_FALSE(fs::exists(apps / ".installing-abcdef"));
+}
+
+TEST_F(Reset, IsRefusedForAnApplicationThatComesUpMeanwhile) {
+    device_.must({"set", "language", "ko_KR"});
+    const device::Folder folder(device_.root());
+    device::Descriptor held(open(folder.databaseLock().c_str(), O_RDWR | O_CLOEXEC));
+    ASSERT_EQ(flock(held.get(), LOCK_EX), 0);
+    auto result = std::async(std::launch::async, [&] { return run({"reset"}); });
+    for (int attempt = 0; attempt < 1000 && !isOpen(folder.databaseLock()); ++attempt) {
+        poll(nullptr, 0, 2);
+    }
+    EXPECT_TRUE(isOpen(folder.databaseLock())) << "it has seen that nothing runs, and waits";
+    {
+        const device::ApplicationLock comingUp(folder, "com.example.app");
+        held = device::Descriptor();
+        EXPECT_EQ(result.get(), failed("com.example.app runs on this device; end it with 'kest-device stop' first"));
+    }
+    EXPECT_EQ(run({"get", "language"}), done("ko_KR\n"));
 }

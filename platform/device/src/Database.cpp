@@ -61,6 +61,10 @@ Database::Impatience::~Impatience() {
     sqlite3_busy_timeout(database_.sql().getHandle(), busyTimeoutInMilliseconds);
 }
 
+Database::Hold::Hold(const Folder& folder) : lock_(std::make_unique<FileLock>(folder.databaseLock())) {}
+
+Database::Hold::~Hold() = default;
+
 Database::Database(const Folder& folder, Check check)
     : file_(folder.database()), lock_(folder.databaseLock()), suspicion_(folder.databaseSuspicion()) {
     const FileLock lock(lock_);

@@ -62,6 +62,12 @@ void makeAppsFolder(const std::filesystem::path& apps) {
         throw Error(apps.string() + ": cannot be made: " + error.message() + "; make the device's folder writable");
 }
 
+/// A folder without a manifest is somebody else's, or what is left of a package.
+bool isPackage(const std::filesystem::path& folder) {
+    std::error_code error;
+    return std::filesystem::exists(folder / "tizen-manifest.xml", error);
+}
+
 std::set<std::string> foldersIn(const std::filesystem::path& parent) {
     std::set<std::string> names;
     std::error_code error;
@@ -113,8 +119,7 @@ Packages::~Packages() = default;
 std::optional<std::filesystem::path> Packages::rootOf(const std::string& id) const {
     if (!BusName::isValid(id))
         return std::nullopt;
-    std::error_code error;
-    if (std::filesystem::is_directory(folder_.apps() / id, error))
+    if (isPackage(folder_.apps() / id))
         return folder_.apps() / id;
     if (isRemoved(database_, id))
         return std::nullopt;
@@ -215,7 +220,24 @@ void Packages::remove(const std::string& id, PackageEvent event) {
     // package that the folder covered come up in between.
     if (shippedRootOf(id))
         noteRemoval(database_, id);
-    moveAway(folder_.apps() / id, removed.path() / id);
+    if (isPackage(folder_.apps() / id))
+        moveAway(folder_.apps() / id, removed.path() / id);
+}
+
+std::vector<std::string> Packages::removeInstalled(const Folder& folder) {
+    std::vector<std::string> ids;
+    if (foldersIn(folder.apps()).empty())
+        return ids;
+    const FileLock lock(folder.apps() / lockName);
+    removeRemains(folder.apps());
+    const Scratch removed(makeTemporaryFolder(folder.apps(), removalPrefix));
+    for (const std::string& name : foldersIn(folder.apps())) {
+        if (!isPackage(folder.apps() / name))
+            continue;
+        moveAway(folder.apps() / name, removed.path() / name);
+        ids.push_back(name);
+    }
+    return ids;
 }
 
 void Packages::publishCompletion(PackageEvent event) {

@@ -1,7 +1,7 @@
-#include "Applications.h"
 #include "Commands.h"
 #include "FolderLock.h"
 #include "PrivateBus.h"
+#include "device/ApplicationLock.h"
 #include "device/Error.h"
 
 #include <iostream>
@@ -20,9 +20,11 @@ Other files in the folder, also a damaged database that was set aside, stay. Ref
 Example:
   kest-device stop && kest-device reset)";
 
-void requireNothingRuns(Session& session) {
-    for (const RunningApplication& application : runningApplications(session)) {
-        throw device::Error(application.id + " runs on this device; end it with 'kest-device stop' first");
+void requireNothingRuns(const device::Folder& folder) {
+    for (const std::string& id : device::ApplicationLock::applications(folder)) {
+        if (device::ApplicationLock::holder(folder, id)) {
+            throw device::Error(id + " runs on this device; end it with 'kest-device stop' first");
+        }
     }
 }
 
@@ -36,40 +38,39 @@ void removeAll(const fs::path& path, std::vector<std::string>& removed) {
     }
 }
 
-/// The folders of the packages only: what else lies there is not the device's.
-void removePackages(const device::Folder& folder, std::vector<std::string>& removed) {
-    std::error_code error;
-    for (fs::directory_iterator entry(folder.apps(), error), end; !error && entry != end; entry.increment(error)) {
-        if (fs::exists(entry->path() / "tizen-manifest.xml")) {
-            removeAll(entry->path(), removed);
-        }
-    }
-    std::error_code notEmpty;
-    for (fs::path path = folder.apps(); path != folder.root(); path = path.parent_path()) {
-        fs::remove(path, notEmpty);
-    }
-}
-
-void reset(Session& session) {
-    const device::Folder& folder = session.folder();
-    folder.create();
-    const FolderLock lock(folder);
-    requireNothingRuns(session);
-    try {
-        session.device();
-    } catch (const device::DamagedError& damaged) {
-        std::cout << damaged.what() << '\n';
-    }
-    session.close();
-    PrivateBus(folder).stop();
-
+/// Returns the names of what was there.
+std::vector<std::string> removeContents(const device::Folder& folder) {
     std::vector<std::string> removed;
     for (const fs::path& path : {folder.database(), fs::path(folder.database().string() + "-wal"),
                                  fs::path(folder.database().string() + "-shm"), folder.log(),
                                  fs::path(folder.log().string() + ".1"), folder.outputs(), folder.toolkit()}) {
         removeAll(path, removed);
     }
-    removePackages(folder, removed);
+    for (const std::string& id : device::Packages::removeInstalled(folder)) {
+        removed.push_back(id);
+    }
+    return removed;
+}
+
+void reset(Session& session) {
+    const device::Folder& folder = session.folder();
+    folder.create();
+    const FolderLock lock(folder);
+    requireNothingRuns(folder);
+    try {
+        session.device();
+    } catch (const device::DamagedError& damaged) {
+        std::cout << damaged.what() << '\n';
+    }
+    session.close();
+    std::vector<std::string> removed;
+    {
+        // An application that has come up meanwhile has its lock, or waits to open the database.
+        const device::Database::Hold hold(folder);
+        requireNothingRuns(folder);
+        PrivateBus(folder).stop();
+        removed = removeContents(folder);
+    }
     session.device();
     std::cout << "the device " << folder.root().string() << " is as new; removed:";
     for (const std::string& name : removed) {

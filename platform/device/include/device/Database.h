@@ -11,6 +11,7 @@
 
 namespace device {
 
+class FileLock;
 class Folder;
 
 /// The device's SQLite database (WAL, one connection a process): its opening, its schema, its health.
@@ -69,6 +70,19 @@ public:
 
     private:
         Database& database_;
+    };
+
+    /// While it lives, no process opens the database, so that its files can be removed.
+    class Hold {
+    public:
+        /// Throws Error when another process keeps the database's lock.
+        explicit Hold(const Folder& folder);
+        ~Hold();
+        Hold(const Hold&) = delete;
+        Hold& operator=(const Hold&) = delete;
+
+    private:
+        std::unique_ptr<FileLock> lock_;
     };
 
     /// Runs `work` and turns a failure of the database in it into an Error for people.

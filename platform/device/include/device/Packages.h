@@ -42,8 +42,8 @@ struct Package {
 Package readManifest(const std::filesystem::path& root);
 
 /// The packages of the device: those that the build ships, read where they lie, as changed by what was
-/// installed and removed on this device. Installed is what has its folder there, whatever the database says or has
-/// lost; the database tells which of the build's packages were removed.
+/// installed and removed on this device. Installed is what has its folder with its manifest there, whatever the
+/// database says or has lost; the database tells which of the build's packages were removed.
 /// Of what was read it keeps only manifests, until their files change.
 /// All throw Error when the database fails.
 class Packages {
@@ -67,6 +67,11 @@ public:
     /// Removes the package from the device, also one that the build ships (which stays where it lies).
     /// Publishes as install() does. Throws Error when it is not installed, or cannot be removed and stays.
     void uninstall(const std::string& id);
+
+    /// Removes all that was installed on the device, and what was cut short has left; other folders stay. Killed at any
+    /// moment, it has removed each package whole or not at all. Publishes nothing: no application runs meanwhile.
+    /// Returns the ids. Throws Error when one cannot be removed.
+    static std::vector<std::string> removeInstalled(const Folder& folder);
 
 private:
     std::optional<std::filesystem::path> shippedRootOf(const std::string& id) const;
