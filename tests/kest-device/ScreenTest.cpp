@@ -1,5 +1,11 @@
 #include "ToolTest.h"
 
+#include "device/ApplicationLock.h"
+
+#include <future>
+#include <optional>
+#include <poll.h>
+
 using testing::HasSubstr;
 using testing::IsEmpty;
 
@@ -130,6 +136,30 @@ TEST_F(OnScreen, WaitingForTheEndEndsWithTheApplication) {
     EXPECT_EQ(run({"wait-for", "ended"}), done());
 }
 
+TEST_F(OnScreen, WaitingGoesOnUntilItsTimeIsOverThoughTheApplicationDoesNotAnswer) {
+    const std::string named = "com.example.sample (process " + std::to_string(device_.application()) + ")";
+    kill(device_.application(), SIGSTOP);
+
+    for (const std::vector<std::string>& app : {std::vector<std::string>{}, {"--app", sample}}) {
+        std::vector<std::string> words{"wait-for", "text=Apple", "--timeout", "0.5"};
+        words.insert(words.end(), app.begin(), app.end());
+        EXPECT_EQ(run(words), failed("still not text=Apple after 0.5 seconds: " + named +
+                                     " does not answer; end it with 'kest-device stop'"));
+    }
+}
+
+TEST_F(OnScreen, WaitingFindsTheBusThatComesWithTheApplication) {
+    device_.must({"stop"});
+    test_tool::TestDevice same;
+    same.setRoot(device_.root());
+    auto result = std::async(std::launch::async, [&] { return same.run({"wait-for", "text=Apple", "--app", sample}); });
+    poll(nullptr, 0, 300);
+
+    EXPECT_EQ(start().status, 0);
+
+    EXPECT_EQ(result.get(), done());
+}
+
 TEST_F(OnScreen, AScreenshotIsSavedWhereThePersonIs) {
     EXPECT_EQ(run({"screenshot", "screen.png"}), done());
 
@@ -158,6 +188,28 @@ TEST_F(OnScreen, AnApplicationThatHangsIsSaidToDoSo) {
     EXPECT_EQ(run({"stop"}), done("com.example.sample (process " + std::to_string(application) +
                                   ") did not answer and was ended by force\n"));
     EXPECT_THAT(device_.processes(), IsEmpty());
+}
+
+TEST_F(WithoutScreen, WaitingEndsWithItsTimeThoughAnApplicationIsComingUp) {
+    device_.must({"get"});
+    const device::ApplicationLock comingUp(device::Folder(device_.root()), "com.example.app");
+
+    EXPECT_EQ(run({"wait-for", "text=A", "--timeout", "0.2"}),
+              failed("still not text=A after 0.2 seconds: com.example.app (process " + std::to_string(getpid()) +
+                     ") does not answer; end it with 'kest-device stop'"));
+}
+
+TEST_F(WithoutScreen, ACommandWaitsForTheEndOfAnApplicationThatHasLeftTheBus) {
+    device_.must({"get"});
+    std::optional<device::ApplicationLock> ending;
+    ending.emplace(device::Folder(device_.root()), "com.example.app");
+    // From then on it is no longer one that may be coming up.
+    poll(nullptr, 0, 5500);
+    auto result = std::async(std::launch::async, [&] { return run({"tree"}); });
+    poll(nullptr, 0, 300);
+    ending.reset();
+
+    EXPECT_EQ(result.get(), failed("no application runs on this device; start one with 'kest-device start'"));
 }
 
 TEST_F(WithoutScreen, CommandsSayThatNothingRuns) {

@@ -16,6 +16,9 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto patience = 3s;
+/// How long a command waits for an application that is on its way to the bus, or to its end.
+constexpr auto longestStart = 5s;
+constexpr auto longestEnd = 2s;
 constexpr auto pollInterval = 50ms;
 
 /// Which device the application belongs to; empty when it does not answer.
@@ -66,31 +69,13 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
 }
 
 RunningApplication theOneMeant(Session& session, const std::string& id) {
-    if (!id.empty()) {
-        requireApplicationId(id);
+    if (const std::optional<RunningApplication> meant = findApplication(session, id)) {
+        return *meant;
     }
-    const std::vector<RunningApplication> running = runningApplications(session);
-    if (id.empty() && running.empty()) {
-        throw device::Error("no application runs on this device; start one with 'kest-device start'");
-    }
-    if (id.empty()) {
-        return inFront(session, running);
-    }
-    const auto meant = std::find_if(running.begin(), running.end(),
-                                    [&](const RunningApplication& application) { return application.id == id; });
-    if (meant == running.end()) {
-        throw device::Error(id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
-    }
-    return *meant;
+    throw doesNotRun(id);
 }
 
 }  // namespace
-
-void requireApplicationId(const std::string& id) {
-    if (const std::string fault = device::BusName::faultOf(id); !fault.empty()) {
-        throw UsageError('"' + id + "\" is no application id: " + fault);
-    }
-}
 
 std::string nameOf(const RunningApplication& application) {
     return application.id + " (process " + std::to_string(application.process.id()) + ")";
@@ -121,25 +106,47 @@ void requireOwnBus(Session& session, const device::Bus& bus) {
     }
 }
 
+std::optional<RunningApplication> findApplication(Session& session, const std::string& id) {
+    const std::vector<RunningApplication> running = runningApplications(session);
+    if (id.empty() && !running.empty()) {
+        return inFront(session, running);
+    }
+    const auto meant = std::find_if(running.begin(), running.end(),
+                                    [&](const RunningApplication& application) { return application.id == id; });
+    return meant == running.end() ? std::nullopt : std::optional(*meant);
+}
+
+device::Error doesNotRun(const std::string& id) {
+    return device::Error(id.empty()
+                             ? "no application runs on this device; start one with 'kest-device start'"
+                             : id + " does not run on this device; start it with 'kest-device start -- " + id + "'");
+}
+
+device::Error doesNotAnswer(const RunningApplication& application) {
+    return device::Error(nameOf(application) + " does not answer; end it with 'kest-device stop'");
+}
+
 RunningApplication theApplication(Session& session, const std::string& id) {
+    const auto begin = std::chrono::steady_clock::now();
     RunningApplication meant = theOneMeant(session, id);
-    // One that has just been launched is in front before it can answer.
-    while (!meant.onBus && isComingUp(meant.process)) {
+    // One that has just been launched is in front before it can answer, and one that ends for a while after it could.
+    while (!meant.onBus) {
+        if (std::chrono::steady_clock::now() - begin >= (isComingUp(meant.process) ? longestStart : longestEnd)) {
+            throw doesNotAnswer(meant);
+        }
         std::this_thread::sleep_for(pollInterval);
         meant = theOneMeant(session, id);
-    }
-    if (!meant.onBus) {
-        throw device::Error(nameOf(meant) + " does not answer; end it with 'kest-device stop'");
     }
     return meant;
 }
 
-device::BusCall callTo(Session& session, const std::string& id, const char* interface) {
+device::BusCall callTo(Session& session, const std::string& id, const char* interface,
+                       std::chrono::milliseconds timeout) {
     device::Bus* bus = session.bus();
     if (!bus) {
         throw device::Error("the device has no bus; start one with 'kest-device start'");
     }
-    return device::BusCall(*bus, id, device::bus::pathOf(id), interface, 20s);
+    return device::BusCall(*bus, id, device::bus::pathOf(id), interface, timeout);
 }
 
 void settle(Session& session) {

@@ -1,11 +1,13 @@
 #include "Foreground.h"
 
+#include "device/BootClock.h"
+#include "device/Error.h"
+
 #include <algorithm>
-#include <chrono>
-#include <ctime>
+#include <charconv>
 #include <fstream>
-#include <iomanip>
 #include <sstream>
+#include <string>
 #include <unistd.h>
 
 namespace tool {
@@ -14,14 +16,10 @@ namespace {
 
 constexpr double longestStart = 5;
 
-/// Seconds of the clock on the wall.
+/// By device::secondsSinceBoot().
 using Moment = double;
 
-Moment now() {
-    return std::chrono::duration<double>(std::chrono::system_clock::now().time_since_epoch()).count();
-}
-
-/// When the process began; 0 when that cannot be told.
+/// When the process began; 0 when that cannot be told, as in a container where it would be later than now.
 Moment startOf(const device::Process& process) {
     std::ifstream stream("/proc/" + std::to_string(process.id()) + "/stat");
     std::string line;
@@ -33,33 +31,27 @@ Moment startOf(const device::Process& process) {
         rest >> word;
     }
     double ticks = 0;
-    double sinceBoot = 0;
-    if (!(rest >> ticks) || !(std::ifstream("/proc/uptime") >> sinceBoot)) {
+    if (!(rest >> ticks)) {
         return 0;
     }
-    return now() - sinceBoot + ticks / static_cast<double>(sysconf(_SC_CLK_TCK));
+    const Moment start = ticks / static_cast<double>(sysconf(_SC_CLK_TCK));
+    return start <= device::secondsSinceBoot() ? start : 0;
 }
 
-/// Of a time as the device writes it, "2024-05-01T12:00:00.123Z"; 0 when it is none.
-Moment momentOf(const std::string& time) {
-    std::istringstream stream(time);
-    std::tm parts{};
-    double fraction = 0;
-    if (!(stream >> std::get_time(&parts, "%Y-%m-%dT%H:%M:%S"))) {
+/// What the application says of it; 0 when it has just ended.
+Moment lastRequestOf(Session& session, const std::string& id) {
+    try {
+        const std::string text = callTo(session, id, device::bus::applicationInterface).property("LastRequest");
+        Moment last = 0;
+        std::from_chars(text.data(), text.data() + text.size(), last);
+        return last;
+    } catch (const device::Error&) {
         return 0;
     }
-    stream >> fraction;
-    return static_cast<double>(timegm(&parts)) + fraction;
 }
 
-Moment lastHandOver(const std::vector<device::LaunchRecord>& launches, const std::string& id) {
-    Moment last = 0;
-    for (const device::LaunchRecord& record : launches) {
-        if (record.request.appId == id && record.outcome == device::LaunchOutcome::HandedOver) {
-            last = std::max(last, momentOf(record.time));
-        }
-    }
-    return last;
+Moment launchOf(Session& session, const RunningApplication& application) {
+    return application.onBus ? lastRequestOf(session, application.id) : startOf(application.process);
 }
 
 }  // namespace
@@ -69,10 +61,9 @@ const RunningApplication& inFront(Session& session, const std::vector<RunningApp
     if (running.size() == 1) {
         return *front;
     }
-    const std::vector<device::LaunchRecord> launches = session.device().launches().all();
     Moment latest = -1;
     for (const RunningApplication& application : running) {
-        const Moment launched = std::max(startOf(application.process), lastHandOver(launches, application.id));
+        const Moment launched = launchOf(session, application);
         if (launched > latest) {
             latest = launched;
             front = &application;
@@ -82,7 +73,8 @@ const RunningApplication& inFront(Session& session, const std::vector<RunningApp
 }
 
 bool isComingUp(const device::Process& process) {
-    return now() - startOf(process) < longestStart;
+    const Moment start = startOf(process);
+    return start > 0 && device::secondsSinceBoot() - start < longestStart;
 }
 
 }  // namespace tool

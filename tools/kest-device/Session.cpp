@@ -26,14 +26,13 @@ device::Device& Session::device() {
 }
 
 device::Bus* Session::bus() {
-    return busSought_ ? bus_.get() : reconnect();
+    return bus_ ? bus_.get() : reconnect();
 }
 
 device::Bus* Session::reconnect() {
     // The bus is reached through EFL, which would keep files in the user's home.
     device::keepToolkitFilesIn(folder());
     bus_ = device::Bus::connect(folder());
-    busSought_ = true;
     return bus_.get();
 }
 
@@ -48,7 +47,6 @@ device::Device& Session::connectedDevice() {
 void Session::close() {
     device_.reset();
     bus_.reset();
-    busSought_ = false;
 }
 
 }  // namespace tool

@@ -23,7 +23,7 @@ public:
     /// Throws device::Error when the device cannot be opened, also when its damaged database was set aside, or was not
     /// because an application runs.
     device::Device& device();
-    /// Null when the device has no bus.
+    /// Null when the device has no bus, which it may get meanwhile.
     device::Bus* bus();
     /// Looks for the bus anew; for whoever has just started one.
     device::Bus* reconnect();
@@ -35,7 +35,6 @@ public:
 private:
     std::unique_ptr<device::Folder> folder_;
     std::unique_ptr<device::Bus> bus_;
-    bool busSought_ = false;
     std::unique_ptr<device::Device> device_;
 };
 

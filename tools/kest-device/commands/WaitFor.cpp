@@ -17,6 +17,8 @@ using namespace std::chrono_literals;
 using Clock = std::chrono::steady_clock;
 
 constexpr auto pollInterval = 50ms;
+/// What an application has for its answer at least.
+constexpr auto answerTime = std::chrono::milliseconds(3000);
 
 constexpr char about[] = R"(CONDITION is one of
   text=TEXT      a text in sight equals or holds TEXT
@@ -26,7 +28,8 @@ constexpr char about[] = R"(CONDITION is one of
   log=TEXT       a line of the log holds TEXT, also an earlier one
   usage=VALUE    a usage record has VALUE as one of its values
   ended          no application runs on the device any more
-It is looked at until it is so; after the time-out that is an error. An application that --app names may yet come up.
+It is looked at until it is so; after the time-out that is an error. An application that --app names may yet come up,
+and one in front may still be on its way to the screen.
 
 Examples:
   kest-device wait-for text="Wi-Fi"
@@ -59,31 +62,52 @@ bool usageHas(Session& session, const std::string& value) {
     return false;
 }
 
-/// An application that is named may be on its way.
-bool answers(Session& session, const std::string& appId) {
-    const std::vector<RunningApplication> running = runningApplications(session);
-    return std::any_of(running.begin(), running.end(), [&](const RunningApplication& application) {
-        return application.id == appId && application.onBus;
-    });
+/// What a look at the device came to.
+struct Look {
+    bool holds = false;
+    std::string obstacle = {};  ///< why it cannot be told yet; empty when it can
+};
+
+/// It may be on its way to the bus, or to its end.
+Look lookAtScreen(Session& session, const Options& options, Clock::time_point deadline) {
+    const std::optional<RunningApplication> meant = findApplication(session, options.appId);
+    if (!meant && options.appId.empty()) {
+        throw doesNotRun("");
+    }
+    if (!meant) {
+        return {false, options.appId + " does not run on this device"};
+    }
+    if (!meant->onBus) {
+        return {false, doesNotAnswer(*meant).what()};
+    }
+    const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now());
+    try {
+        const device::BusCall screen =
+            callTo(session, meant->id, device::bus::screenInterface, std::max(left, answerTime));
+        return {screen.truth("Has", {options.condition})};
+    } catch (const device::Error&) {
+        const std::optional<RunningApplication> still = findApplication(session, meant->id);
+        if (still && still->onBus) {
+            throw;
+        }
+        return {false, still ? doesNotAnswer(*still).what() : meant->id + " has ended"};
+    }
 }
 
-bool holds(Session& session, const Options& options) {
+Look look(Session& session, const Options& options, Clock::time_point deadline) {
     const std::size_t equals = options.condition.find('=');
     const std::string kind = options.condition.substr(0, equals);
     const std::string value = equals == std::string::npos ? "" : options.condition.substr(equals + 1);
     if (options.condition == "ended") {
-        return runningApplications(session).empty();
+        return {runningApplications(session).empty()};
     }
     if (kind == "log") {
-        return logHolds(session, value);
+        return {logHolds(session, value)};
     }
     if (kind == "usage") {
-        return usageHas(session, value);
+        return {usageHas(session, value)};
     }
-    if (!options.appId.empty() && !answers(session, options.appId)) {
-        return false;
-    }
-    return callTo(session, theApplication(session, options.appId).id).truth("Has", {options.condition});
+    return lookAtScreen(session, options, deadline);
 }
 
 void requireKnown(const std::string& condition) {
@@ -102,14 +126,18 @@ void requireKnown(const std::string& condition) {
 
 void waitFor(Session& session, const Options& options) {
     requireKnown(options.condition);
-    const auto deadline = Clock::now() + std::chrono::duration<double>(options.seconds);
-    while (!holds(session, options)) {
+    const auto time = std::chrono::duration<double>(options.seconds);
+    const auto deadline = Clock::now() + std::chrono::duration_cast<Clock::duration>(time);
+    for (;;) {
+        const Look found = look(session, options, deadline);
+        if (found.holds) {
+            return;
+        }
         if (Clock::now() >= deadline) {
             std::ostringstream seconds;
             seconds << options.seconds;
-            const bool away = !options.appId.empty() && !answers(session, options.appId);
             throw device::Error("still not " + options.condition + " after " + seconds.str() + " seconds" +
-                                (away ? ": " + options.appId + " does not run on this device" : ""));
+                                (found.obstacle.empty() ? "" : ": " + found.obstacle));
         }
         std::this_thread::sleep_for(pollInterval);
     }
