@@ -61,6 +61,18 @@ TEST_F(MirroredPager, TurnsToTheNextPageByASwipeToTheRight) {
     expectInView(3);
 }
 
+TEST_F(MirroredPager, OfOnePageBouncesBothWaysAndComesToRest) {
+    listenTo(0, 1);
+    for (const int way : {0, 1}) {
+        way ? swipeLeft() : swipeRight();
+        EXPECT_NE(0, test_ui::geometry(pages_[0]->getEvasObj()).x);
+        test_ui::runFor(1.0);
+        EXPECT_THAT(heard(), ElementsAre("start", "stop 0"));
+        EXPECT_EQ(0, test_ui::geometry(pages_[0]->getEvasObj()).x);
+    }
+    EXPECT_FALSE(test_ui::clock::isAnimating());
+}
+
 TEST_F(MirroredPager, BouncesAtBothEndsAndComesToRest) {
     listenTo(0);
     swipeLeft();

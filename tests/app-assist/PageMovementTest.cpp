@@ -176,14 +176,16 @@ TEST_F(PageMovement, APageThatIsShownAtOnceIsNoMovementAndEndsOneThatRuns) {
     EXPECT_EQ(0, pager_->inView());
 }
 
-TEST_F(PageMovement, APagerOfOnePageIsNotMovedByASwipe) {
+TEST_F(PageMovement, APagerOfOnePageOnlyBounces) {
     listenTo(0, 1);
     for (const double seconds : {0.06, 0.15, 1.0}) {
-        screen().swipe({600, 700}, {150, 700}, seconds);
-        EXPECT_EQ(0, test_ui::geometry(pages_[0]->getEvasObj()).x) << seconds;
-        test_ui::runFor(1.0);
-        EXPECT_EQ(0, test_ui::geometry(pages_[0]->getEvasObj()).x);
-        EXPECT_THAT(heard(), ElementsAre()) << seconds;
+        for (const auto& [from, to] : {std::pair(600, 150), std::pair(150, 600)}) {
+            screen().swipe({from, 700}, {to, 700}, seconds);
+            EXPECT_NE(0, test_ui::geometry(pages_[0]->getEvasObj()).x) << seconds;
+            test_ui::runFor(1.0);
+            EXPECT_EQ(0, test_ui::geometry(pages_[0]->getEvasObj()).x);
+            EXPECT_THAT(heard(), ElementsAre("start", "stop 0")) << seconds;
+        }
     }
     EXPECT_EQ(0, framesInASecond());
 }

@@ -78,8 +78,7 @@ TEST_F(Swipe, BeforeTheFirstPageBouncesAndDisplaysItAgainOnce) {
     EXPECT_THAT(newLog(), ElementsAre(hit("__pageScrollStartCb"), hit("__pageScrollStopCb"), display()));
 }
 
-// EFL drags nothing that it shows whole, so there is not even a bounce.
-TEST_F(Swipe, OfAPagerWithOnePageMovesNothing) {
+TEST_F(Swipe, OfAPagerWithOnePageBouncesAndDisplaysItAgainOnce) {
     writeTips({tip("none.png", "A")});
     openAtRest();
     const test_ui::Point middle = test_ui::geometry(video()).middle();
@@ -90,12 +89,12 @@ TEST_F(Swipe, OfAPagerWithOnePageMovesNothing) {
             screen().moveTo({middle.x + way * 50 * step, middle.y});
         }
         test_ui::runFor(0.02);
-        EXPECT_EQ(test_ui::geometry(page()).x, 0);
+        EXPECT_GT(way * test_ui::geometry(page()).x, 20);
         screen().lift();
         test_ui::runFor(2);
         EXPECT_EQ(test_ui::geometry(page()).x, 0);
         EXPECT_EQ(title(), "Tips 1/1");
-        EXPECT_THAT(newLog(), IsEmpty());
+        EXPECT_THAT(newLog(), ElementsAre(hit("__pageScrollStartCb"), hit("__pageScrollStopCb"), display()));
     }
 }
 

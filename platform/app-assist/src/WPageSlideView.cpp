@@ -55,6 +55,8 @@ void WPageSlideView::onInitScroller(Evas_Object* scroller) {
 // By hand: widgets overwrite a size that they were told to have at least, so no box would make them a page wide.
 // Where reading begins at the right the first page lies there, as the scroller counts its pages. Only pages that are
 // seen move along: all others wait beside the view, because moving everything in them would take most of a frame.
+// EFL drags nothing that it shows whole: a row of one page has a pixel more, so that it bounces as a page at either end
+// does, and the page stays where it is within that pixel.
 void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* children, void* data) {
     const auto* view = static_cast<WPageSlideView*>(data);
     int rowX = 0, y = 0, viewX = 0, viewWidth = 0, width = 0, height = 0;
@@ -63,17 +65,19 @@ void WPageSlideView::layPagesOut(Evas_Object* box, Evas_Object_Box_Data* childre
     elm_scroller_region_get(view->scroller_, nullptr, nullptr, &width, &height);
     const int count = static_cast<int>(eina_list_count(children->children));
     const bool mirrored = elm_object_mirrored_get(view->scroller_);
+    const int more = count == 1 ? 1 : 0;
+    const int begin = rowX + std::clamp(viewX - rowX, 0, more);
     int index = 0;
     const Eina_List* node = nullptr;
     void* each = nullptr;
     EINA_LIST_FOREACH(children->children, node, each) {
         Evas_Object* page = static_cast<Evas_Object_Box_Option*>(each)->obj;
-        const int x = rowX + width * (mirrored ? count - 1 - index : index);
+        const int x = begin + width * (mirrored ? count - 1 - index : index);
         evas_object_move(page, std::clamp(x, viewX - width, viewX + viewWidth), y);
         evas_object_resize(page, width, height);
         ++index;
     }
-    evas_object_size_hint_min_set(box, width * count, height);
+    evas_object_size_hint_min_set(box, width * count + more, height);
 }
 
 void WPageSlideView::appendPage(WView* page) {
