@@ -27,7 +27,8 @@ TEST_F(Name, OfAnApplicationIsThatWhichItsTipsGiveIt) {
         std::set<std::string> names;
         for (const ListRow& row : rows())
             names.insert(row.top);
-        for (const char* id : {"clock", "settings", "heartrate", "exercise", "messages", "phone", "music"})
+        for (const char* id : {"clock", "settings", "heartrate", "exercise", "messages", "phone", "music", "weather",
+                               "flashlight", "wallet"})
             EXPECT_TRUE(names.contains(nameOf(std::string("com.ravella.") + id)))
                 << language << ": " << nameOf(std::string("com.ravella.") + id);
     }
