@@ -132,7 +132,7 @@ TEST_P(Soak, OfOpeningsAndClosingsLeavesNothingBehind) {
     EXPECT_LT(grown, 100000 + 4000L * openings);
 }
 
-TEST_P(Soak, OfSwipesEndsOnAPageThatIsDisplayedAndPlays) {
+TEST_P(Soak, OfSwipesEndsOnAPageThatIsDisplayed) {
     const int swipes = test_ui::timesOf(80, 10000);
     SCOPED_TRACE("seed " + std::to_string(seed));
     open(3);
