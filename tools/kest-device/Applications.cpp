@@ -68,6 +68,13 @@ device::Error otherDevice(const std::string& folder, const std::string& applicat
                          "; end it with 'KEST_DEVICE=" + folder + " kest-device stop' first");
 }
 
+/// As the command line names it, or not.
+void requireIdOrNone(const std::string& id) {
+    if (!id.empty()) {
+        requireApplicationId(id);
+    }
+}
+
 RunningApplication theOneMeant(Session& session, const std::string& id) {
     if (const std::optional<RunningApplication> meant = findApplication(session, id)) {
         return *meant;
@@ -76,6 +83,12 @@ RunningApplication theOneMeant(Session& session, const std::string& id) {
 }
 
 }  // namespace
+
+void requireApplicationId(const std::string& id) {
+    if (const std::string fault = device::BusName::faultOf(id); !fault.empty()) {
+        throw UsageError('"' + id + "\" is no application id: " + fault);
+    }
+}
 
 std::string nameOf(const RunningApplication& application) {
     return application.id + " (process " + std::to_string(application.process.id()) + ")";
@@ -107,6 +120,7 @@ void requireOwnBus(Session& session, const device::Bus& bus) {
 }
 
 std::optional<RunningApplication> findApplication(Session& session, const std::string& id) {
+    requireIdOrNone(id);
     const std::vector<RunningApplication> running = runningApplications(session);
     if (id.empty() && !running.empty()) {
         return inFront(session, running);

@@ -19,6 +19,9 @@ struct RunningApplication {
     bool onBus = true;  ///< false: it runs without a bus, or does not answer on it
 };
 
+/// Throws UsageError that says which part is wrong of what can be no application's id.
+void requireApplicationId(const std::string& id);
+
 /// How people are told of it: "com.example.sample (process 4711)".
 std::string nameOf(const RunningApplication& application);
 
