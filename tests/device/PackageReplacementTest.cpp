@@ -45,6 +45,7 @@ TEST_F(PackageReplacement, PutsTheOldOneBackWhenTheNewOneCannotComeInItsPlace) {
         EXPECT_EQ(messageOf([&] { packages.install(update_); }),
                   root_.string() + ": cannot be replaced: Permission denied");
     }
+    ASSERT_TRUE(packages.find("com.example.tea"));
     EXPECT_EQ(packages.find("com.example.tea")->version, "1.0");
     EXPECT_EQ(readFile(root_ / "res/only-in-the-old-one"), "old");
     EXPECT_THAT(remains(), IsEmpty());
@@ -56,6 +57,7 @@ TEST_F(PackageReplacement, ChangesNothingWhenTheOldOneCannotGo) {
         EXPECT_EQ(messageOf([&] { packages.install(update_); }),
                   root_.string() + ": cannot be replaced: Invalid argument");
     }
+    ASSERT_TRUE(packages.find("com.example.tea"));
     EXPECT_EQ(packages.find("com.example.tea")->version, "1.0");
     EXPECT_THAT(remains(), IsEmpty());
 }

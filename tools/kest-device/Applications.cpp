@@ -18,7 +18,7 @@ using namespace std::chrono_literals;
 constexpr auto patience = 3s;
 /// How long a command waits for an application that is on its way to the bus, or to its end.
 constexpr auto longestStart = 5s;
-constexpr auto longestEnd = 2s;
+constexpr auto longestEnd = 1s;
 constexpr auto pollInterval = 50ms;
 
 /// Which device the application belongs to; empty when it does not answer.

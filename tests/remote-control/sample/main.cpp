@@ -61,7 +61,7 @@ int run(const std::string& mode) {
     device::Device& device = device::Device::current();
     const device::ApplicationLock lock(device.folder(), device.application().id);
     if (mode == "slow") {
-        std::this_thread::sleep_for(std::chrono::seconds(1));
+        std::this_thread::sleep_for(std::chrono::seconds(2));
     }
     Evas_Object* window = elm_win_add(nullptr, "sample", ELM_WIN_BASIC);
     if (!window) {
