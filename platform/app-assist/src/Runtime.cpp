@@ -106,7 +106,7 @@ bool Runtime::createApplication(int argc, char** argv) {
 }
 
 std::optional<int> Runtime::joinBus() {
-    const auto launch = [this](const LaunchRequest::Extras& extras) { deliverFromBus(extras); };
+    const auto launch = [this](const LaunchRequest::Extras& extras) { deliver(extras); };
     try {
         presence_.emplace(*device_, remote_control::Server::Application{[this] { return window(); }, [] { elm_exit(); },
                                                                         launch, device_->application().link});
@@ -176,29 +176,16 @@ Evas_Object* Runtime::window() const {
 
 void Runtime::queueFirstRequest() {
     // From inside the main loop, so that it can end the application, and before the loop draws for the first time: the
-    // first frame has what the request asked for, and no empty one is waited for.
+    // first frame has what the request asked for, and no empty one is waited for. Nor has the loop read the bus then,
+    // so that no request from there overtakes this one.
     firstRequest_ = ecore_idle_enterer_before_add(
         [](void* data) -> Eina_Bool {
-            static_cast<Runtime*>(data)->deliverFirst();
+            auto* self = static_cast<Runtime*>(data);
+            self->firstRequest_ = nullptr;
+            guarded("a launch request", [self] { self->deliver(self->words_.extras); });
             return ECORE_CALLBACK_CANCEL;
         },
         this);
-}
-
-void Runtime::deliverFirst() {
-    firstRequest_ = nullptr;
-    guarded("a launch request", [this] { deliver(words_.extras); });
-}
-
-void Runtime::deliverFromBus(const LaunchRequest::Extras& extras) {
-    // None overtakes the one that the application was started with.
-    if (firstRequest_) {
-        ecore_idle_enterer_del(firstRequest_);
-        deliverFirst();
-    }
-    if (patience_)
-        ecore_timer_del(std::exchange(patience_, nullptr));
-    deliver(extras);
 }
 
 void Runtime::awaitRequest() {
@@ -215,6 +202,8 @@ void Runtime::awaitRequest() {
 }
 
 void Runtime::deliver(const LaunchRequest::Extras& extras) {
+    if (patience_)
+        ecore_timer_del(std::exchange(patience_, nullptr));
     const LaunchRequest request(device_->application().id, extras);
     const bool first = std::exchange(firstLaunch_, false);
     app_.onAppControl(request.handle(), first);

@@ -38,8 +38,6 @@ private:
     /// The exit status of a second process; nullopt when the first has ended meanwhile.
     std::optional<int> handOver();
     void queueFirstRequest();
-    void deliverFirst();
-    void deliverFromBus(const LaunchRequest::Extras& extras);
     /// The application ends when the request does not come that it was started for.
     void awaitRequest();
     void deliver(const LaunchRequest::Extras& extras);
