@@ -17,8 +17,9 @@ TEST_P(Help, OfACommandIsAsItWasWritten) {
 
 INSTANTIATE_TEST_SUITE_P(Commands, Help,
                          testing::Values("start", "launch", "stop", "status", "reset", "get", "set", "unset", "install",
-                                         "uninstall", "packages", "clear", "preferences", "usage", "launches", "log",
-                                         "tree", "tap", "swipe", "key", "wait-for", "screenshot"),
+                                         "uninstall", "packages", "clear", "preferences", "usage", "launches",
+                                         "notifications", "log", "tree", "tap", "swipe", "key", "wait-for",
+                                         "screenshot"),
                          [](const auto& information) {
                              std::string name = information.param;
                              std::erase(name, '-');

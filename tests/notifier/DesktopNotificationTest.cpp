@@ -121,7 +121,7 @@ TEST_F(DesktopNotifications, LaunchTheirApplicationWhenTheyAreClicked) {
     EXPECT_THAT(kept(), IsEmpty());
     const auto launches = device_->launches().all();
     ASSERT_EQ(launches.size(), 1U);
-    EXPECT_EQ(launches[0].request.caller, "com.example.app");
+    EXPECT_EQ(launches[0].request.caller, "device-notifier");
     EXPECT_EQ(launches[0].outcome, device::LaunchOutcome::Started);
     EXPECT_EQ(support::readFile(device_->folder().output(tea)), "page=walk\n");
     EXPECT_THAT(device_.logMessages(), ElementsAre(line(1, "shown on the desktop"), line(1, "clicked")));

@@ -21,7 +21,10 @@ std::string HelpFormatter::make_usage(const CLI::App* app, std::string name) con
     for (const CLI::Option* option : positionalsOf(app)) {
         usage += option->get_required() ? " " + option->get_type_name() : " [" + option->get_type_name() + "]";
     }
-    return usage + (app->get_subcommands({}).empty() ? "\n" : " COMMAND\n");
+    if (app->get_subcommands({}).empty()) {
+        return usage + "\n";
+    }
+    return usage + (app->get_require_subcommand_min() > 0 ? " COMMAND\n" : " [COMMAND]\n");
 }
 
 std::string HelpFormatter::make_positionals(const CLI::App* app) const {

@@ -47,11 +47,11 @@ void describe(CLI::App& app, tool::Session& session) {
     app.formatter(std::make_shared<tool::HelpFormatter>());
     app.get_formatter()->column_width(26);
     for (const auto add :
-         {tool::addStart,    tool::addLaunch,     tool::addStop,        tool::addStatus,  tool::addReset,
-          tool::addGet,      tool::addSet,        tool::addUnset,       tool::addInstall, tool::addUninstall,
-          tool::addPackages, tool::addClear,      tool::addPreferences, tool::addUsage,   tool::addLaunches,
-          tool::addLog,      tool::addTree,       tool::addTap,         tool::addSwipe,   tool::addKey,
-          tool::addWaitFor,  tool::addScreenshot}) {
+         {tool::addStart,         tool::addLaunch,  tool::addStop,        tool::addStatus,  tool::addReset,
+          tool::addGet,           tool::addSet,     tool::addUnset,       tool::addInstall, tool::addUninstall,
+          tool::addPackages,      tool::addClear,   tool::addPreferences, tool::addUsage,   tool::addLaunches,
+          tool::addNotifications, tool::addLog,     tool::addTree,        tool::addTap,     tool::addSwipe,
+          tool::addKey,           tool::addWaitFor, tool::addScreenshot}) {
         add(app, session);
     }
     for (CLI::App* command : app.get_subcommands({})) {

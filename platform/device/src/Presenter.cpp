@@ -76,13 +76,11 @@ void Presenter::takeDown(long long id) const {
             each.process.end();
 }
 
-std::vector<long long> Presenter::takeAllDown() const {
-    std::vector<long long> ids;
-    for (const Shown& each : shown()) {
+std::vector<Presenter::Shown> Presenter::takeAllDown() const {
+    std::vector<Shown> all = shown();
+    for (const Shown& each : all)
         each.process.end();
-        ids.push_back(each.id);
-    }
-    return ids;
+    return all;
 }
 
 }  // namespace device

@@ -13,6 +13,8 @@ namespace {
 
 constexpr char daemonName[] = "org.freedesktop.Notifications";
 constexpr char daemonPath[] = "/org/freedesktop/Notifications";
+/// Who asks for what a click asks for, in the device's record of launches.
+constexpr char caller[] = "device-notifier";
 constexpr char logTag[] = "NOTIFICATION";
 constexpr double secondsBetweenLooks = 0.1;
 /// Longer than the time within which a program that ends has failed to start.
@@ -154,7 +156,7 @@ void DesktopNotification::onAction(void* data, const Eldbus_Message* signal) {
 
 void DesktopNotification::open() {
     const device::Launcher::Result result =
-        device_.launcher().launch({notification_.appId, notification_.launchAppId, notification_.launchExtras});
+        device_.launcher().launch({caller, notification_.launchAppId, notification_.launchExtras});
     if (result != device::Launcher::Result::Accepted)
         return end(device::Log::Level::Warning,
                    "clicked, but " + notification_.launchAppId + " cannot be launched; it stays on the device");

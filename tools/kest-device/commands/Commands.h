@@ -23,6 +23,7 @@ void addClear(CLI::App& app, Session& session);
 void addPreferences(CLI::App& app, Session& session);
 void addUsage(CLI::App& app, Session& session);
 void addLaunches(CLI::App& app, Session& session);
+void addNotifications(CLI::App& app, Session& session);
 void addLog(CLI::App& app, Session& session);
 void addTree(CLI::App& app, Session& session);
 void addTap(CLI::App& app, Session& session);

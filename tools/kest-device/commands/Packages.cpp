@@ -18,7 +18,8 @@ Example:
   kest-device install packages/com.example.game)";
 
 constexpr char uninstallAbout[] =
-    R"(A package that every device has is hidden on this device only; 'kest-device reset' brings it back.
+    R"(A package that every device has is hidden on this device only; 'kest-device reset' brings it back. Notifications of
+the application go with it.
 
 Example:
   kest-device uninstall com.example.game)";
@@ -56,7 +57,14 @@ void install(Session& session, const std::string& source) {
 void uninstall(Session& session, const std::string& id) {
     requireApplicationId(id);
     requireNotRunning(session, id);
-    session.connectedDevice().packages().uninstall(id);
+    device::Device& device = session.connectedDevice();
+    device.packages().uninstall(id);
+    for (const device::Notification& notification : device.notifications().all()) {
+        if (notification.appId == id) {
+            device.presenter().takeDown(notification.id);
+            device.notifications().remove(notification.id);
+        }
+    }
     settle(session);
     std::cout << "uninstalled " << id << '\n';
 }

@@ -1,5 +1,6 @@
 #include "Commands.h"
 #include "FolderLock.h"
+#include "Notifiers.h"
 #include "PrivateBus.h"
 #include "device/ApplicationLock.h"
 #include "device/Error.h"
@@ -57,6 +58,7 @@ void reset(Session& session) {
     folder.create();
     const FolderLock lock(folder);
     requireNothingRuns(folder);
+    takeNotificationsDown(session);
     try {
         session.device();
     } catch (const device::DamagedError& damaged) {

@@ -1,6 +1,7 @@
 #include "Applications.h"
 #include "Commands.h"
 #include "FolderLock.h"
+#include "Notifiers.h"
 #include "PrivateBus.h"
 #include "device/Error.h"
 
@@ -16,7 +17,8 @@ constexpr auto patience = 5s;
 
 constexpr char about[] =
     R"(Asks every running application of the device to end, those too that others have launched, and ends by force what does
-not within 5 seconds. Ends the device's private bus, if it has one. A device on which nothing runs is left as it is.
+not within 5 seconds. Takes the device's notifications off the desktop; they stay on the device. Ends the device's
+private bus, if it has one. A device on which nothing runs is left as it is.
 
 Example:
   kest-device stop)";
@@ -47,14 +49,20 @@ void stop(Session& session) {
     }
     const FolderLock lock(session.folder());
     std::vector<RunningApplication> running = runningApplications(session);
-    if (running.empty()) {
-        std::cout << "nothing runs on this device\n";
-    }
+    bool anything = !running.empty();
     // Again and again: one that ended may have launched another just before.
     for (; !running.empty(); running = runningApplications(session)) {
         for (const RunningApplication& application : running) {
             endApplication(session, application);
         }
+    }
+    // After the applications: the last one may have posted it just before.
+    for (const device::Presenter::Shown& shown : takeNotificationsDown(session)) {
+        std::cout << "the notifier of notification " << shown.id << " (process " << shown.process.id() << ") ended\n";
+        anything = true;
+    }
+    if (!anything) {
+        std::cout << "nothing runs on this device\n";
     }
     PrivateBus(session.folder()).stop();
 }

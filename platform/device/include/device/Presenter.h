@@ -35,8 +35,8 @@ public:
     /// Ends the program that shows it, if one does, which takes it off the desktop; it stays on the device.
     /// Throws Error when the program does not end.
     void takeDown(long long id) const;
-    /// The same for all that show; returns their numbers.
-    std::vector<long long> takeAllDown() const;
+    /// The same for all that show; returns which they were.
+    std::vector<Shown> takeAllDown() const;
 
 private:
     const Folder& folder_;
