@@ -57,9 +57,9 @@ DesktopNotification::DesktopNotification(device::Device& device, device::Bus& bu
     : device_(device), bus_(bus), notification_(std::move(notification)), ended_(std::move(ended)),
       answerMilliseconds_(static_cast<double>(answerTime.count())),
       object_(eldbus_object_get(bus.connection(), daemonName, daemonPath)),
-      proxy_(eldbus_proxy_get(object_, daemonName)) {
-    eldbus_proxy_signal_handler_add(proxy_, "ActionInvoked", onAction, this);
-    eldbus_proxy_signal_handler_add(proxy_, "NotificationClosed", onClosed, this);
+      proxy_(eldbus_proxy_get(object_, daemonName)),
+      actions_(eldbus_proxy_signal_handler_add(proxy_, "ActionInvoked", onAction, this)),
+      closings_(eldbus_proxy_signal_handler_add(proxy_, "NotificationClosed", onClosed, this)) {
     language_ = device_.events().onSetting([this](const std::string& key) {
         if (key == device::keys::language)
             guarded([this] { follow(); });
@@ -73,6 +73,10 @@ DesktopNotification::~DesktopNotification() {
         ecore_timer_del(looking_);
     if (watchesOwner_)
         eldbus_name_owner_changed_callback_del(bus_.connection(), daemonName, onOwner, this);
+    if (pending_)
+        eldbus_pending_cancel(pending_);
+    eldbus_signal_handler_del(actions_);
+    eldbus_signal_handler_del(closings_);
     eldbus_proxy_unref(proxy_);
     eldbus_object_unref(object_);
 }
@@ -86,11 +90,12 @@ void DesktopNotification::log(device::Device& device, device::Log::Level level, 
 }
 
 void DesktopNotification::send(Eldbus_Message* call, Eldbus_Message_Cb answered) {
-    eldbus_proxy_send(proxy_, call, answered, this, answerMilliseconds_);
+    pending_ = eldbus_proxy_send(proxy_, call, answered, this, answerMilliseconds_);
 }
 
 void DesktopNotification::onCapabilities(void* data, const Eldbus_Message* answer, Eldbus_Pending*) {
     auto* self = static_cast<DesktopNotification*>(data);
+    self->pending_ = nullptr;
     self->guarded([&] {
         if (const char* error = errorOf(answer))
             return self->end(device::Log::Level::Warning, "not shown on the desktop: " + std::string(error));
@@ -117,6 +122,7 @@ void DesktopNotification::show() {
 
 void DesktopNotification::onShown(void* data, const Eldbus_Message* answer, Eldbus_Pending*) {
     auto* self = static_cast<DesktopNotification*>(data);
+    self->pending_ = nullptr;
     self->guarded([&] {
         self->isAsking_ = false;
         if (const char* error = errorOf(answer))
@@ -220,6 +226,7 @@ void DesktopNotification::close() {
 
 void DesktopNotification::onTakenDown(void* data, const Eldbus_Message*, Eldbus_Pending*) {
     auto* self = static_cast<DesktopNotification*>(data);
+    self->pending_ = nullptr;
     self->guarded([&] { self->end(device::Log::Level::Info, "taken off the desktop"); });
 }
 

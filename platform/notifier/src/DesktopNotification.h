@@ -67,6 +67,11 @@ private:
     double answerMilliseconds_;
     Eldbus_Object* object_;
     Eldbus_Proxy* proxy_;
+    // Several notifications of one process share the proxy, which may outlive this one.
+    Eldbus_Signal_Handler* actions_;
+    Eldbus_Signal_Handler* closings_;
+    /// The answer that is still to come, one at a time.
+    Eldbus_Pending* pending_ = nullptr;
     device::Events::Subscription language_;
     /// Looks, after the click, what has come of the launch.
     Ecore_Timer* looking_ = nullptr;

@@ -11,6 +11,14 @@ namespace {
 
 constexpr char stateKey[] = "fake daemon";
 
+constexpr Eldbus_Arg_Info capabilityList[] = {{"as", "capabilities"}, {}};
+constexpr Eldbus_Arg_Info oneNumber[] = {{"u", "number"}, {}};
+constexpr Eldbus_Arg_Info notifyArguments[] = {{"s", "application"}, {"u", "replaces"},     {"s", "icon"},
+                                               {"s", "title"},       {"s", "text"},         {"as", "actions"},
+                                               {"a{sv}", "hints"},   {"i", "milliseconds"}, {}};
+constexpr Eldbus_Arg_Info actionArguments[] = {{"u", "number"}, {"s", "action"}, {}};
+constexpr Eldbus_Arg_Info closeArguments[] = {{"u", "number"}, {"u", "reason"}, {}};
+
 enum Signal { actionInvoked, notificationClosed };
 
 std::vector<std::string> textsOf(Eldbus_Message_Iter* list) {
@@ -41,17 +49,12 @@ FakeDaemon::FakeDaemon(const device::Folder& folder, std::vector<std::string> ca
     : bus_(device::Bus::connect(folder)), capabilities_(std::move(capabilities)) {
     if (!bus_)
         throw std::runtime_error("there is no bus for the fake daemon");
-    static const Eldbus_Method methods[] = {
-        {"GetCapabilities", nullptr, ELDBUS_ARGS({"as", "capabilities"}), onCapabilities, 0},
-        {"Notify",
-         ELDBUS_ARGS({"s", "application"}, {"u", "replaces"}, {"s", "icon"}, {"s", "title"}, {"s", "text"},
-                     {"as", "actions"}, {"a{sv}", "hints"}, {"i", "milliseconds"}),
-         ELDBUS_ARGS({"u", "number"}), onNotifyCall, 0},
-        {"CloseNotification", ELDBUS_ARGS({"u", "number"}), nullptr, onClose, 0},
-        {}};
-    static const Eldbus_Signal signals[] = {{"ActionInvoked", ELDBUS_ARGS({"u", "number"}, {"s", "action"}), 0},
-                                            {"NotificationClosed", ELDBUS_ARGS({"u", "number"}, {"u", "reason"}), 0},
+    static const Eldbus_Method methods[] = {{"GetCapabilities", nullptr, capabilityList, onCapabilities, 0},
+                                            {"Notify", notifyArguments, oneNumber, onNotifyCall, 0},
+                                            {"CloseNotification", oneNumber, nullptr, onClose, 0},
                                             {}};
+    static const Eldbus_Signal signals[] = {
+        {"ActionInvoked", actionArguments, 0}, {"NotificationClosed", closeArguments, 0}, {}};
     static const Eldbus_Service_Interface_Desc description = {name, methods, signals, nullptr, nullptr, nullptr};
     interface_ = eldbus_service_interface_register(bus_->connection(), "/org/freedesktop/Notifications", &description);
     eldbus_service_object_data_set(interface_, stateKey, this);
