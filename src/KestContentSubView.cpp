@@ -216,6 +216,7 @@ void KestContentSubView::__languageChangedCb(void* data, Evas_Object*, void*) tr
             KestContentInfo record;
             if (view->entry && view->__copyRecord(record)) {
                 view->__setText(record);
+                view->__setTitle(record);
             }
             view->__displayIfOpened();
             return false;

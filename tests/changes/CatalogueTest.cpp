@@ -1,0 +1,147 @@
+#include "States.h"
+
+#include <filesystem>
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+/// The catalogue's files change. Nobody tells of that: it shows when the catalogue is loaded next.
+class CatalogueChange : public ChangeTest {
+protected:
+    /// A row without a tip, as its list has more rows than the catalogue has tips.
+    static const std::string emptyRow;
+
+    /// Rows are only refreshed: their number stays.
+    void expectRows(const Names& names, Language language, std::size_t count) {
+        std::vector<std::string> expected = rowsOf(names, language);
+        expected.resize(count, emptyRow);
+        EXPECT_EQ(rows(), expected);
+    }
+    /// A change of the theme comes to what the table of the cell says, one of the language has every tip in it, and an
+    /// installation has the list build its rows anew.
+    void expectToShowStepByStep(const Names& catalogue);
+    /// Has the list build its rows anew.
+    void installWeather() {
+        install("com.example.weather");
+        test_ui::runFor(1);
+    }
+};
+
+const std::string CatalogueChange::emptyRow = ", ";
+
+void CatalogueChange::expectToShowStepByStep(const Names& catalogue) {
+    reachState();
+    writeMenuFile(catalogue);
+    setTheme("dark");
+    comeToRest();
+    EXPECT_EQ(top(), GetParam().top);
+    setLanguage(Language::Korean);
+    comeToRest();
+    expectTheWayBack();
+    if (hasList()) {
+        expectRows(catalogue, Language::Korean, 12);
+        installWeather();
+    }
+    expectToWork(hasList() ? tips::with(catalogue, "Weather") : catalogue, Language::Korean);
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+/// The main menu file is gone when the display language changes, which loads the catalogue with force. What has no
+/// record keeps its text; the header counts what there is.
+class LostMenuFile : public CatalogueChange {
+protected:
+    void remove() { std::filesystem::remove(mainMenuFile()); }
+    std::string failure() const {
+        return "KestContentMgr.cpp: __loadMainMenu > Failed to access: -1, " + mainMenuFile().string();
+    }
+    /// The list is empty, but not dead, and it fills when the file is back.
+    void expectTheListToRecover() {
+        expectTheWayBack();
+        expectRows({}, Language::Korean, 12);
+        tapRow(3);
+        test_ui::runFor(0.5);
+        EXPECT_EQ(topView(), "KestMainView");
+        EXPECT_THAT(newRecords(), IsEmpty());
+        EXPECT_THAT(newErrors(), ElementsAre("KestMainView.cpp: __selectItemCb > no record for index:5"));
+        installWeather();
+        EXPECT_THAT(rows(), IsEmpty());
+        EXPECT_THAT(newErrors(), ElementsAre(failure()));
+        writeMenuFile(tips::atFirst());
+        uninstall("com.example.weather");
+        test_ui::runFor(1);
+    }
+};
+
+INSTANTIATE_TEST_SUITE_P(
+    Changes, LostMenuFile,
+    testing::Values(Cell{State::List, "list 팁: 팁 및 안내"}, Cell{State::ScrolledList, "list 팁: "},
+                    Cell{State::PagerComes, "list 팁: 팁 및 안내"}, Cell{State::PagerAtRest, "list 팁: 팁 및 안내"},
+                    Cell{State::PicturesPlay, "list 팁: 팁 및 안내"}, Cell{State::FingerSwipes, "list 팁: 팁 및 안내"},
+                    Cell{State::PagesGlide, "list 팁: 팁 및 안내"},
+                    Cell{State::RequestedPagerComes, "list 팁: 팁 및 안내"},
+                    Cell{State::RequestedPager, "list 팁: 팁 및 안내"},
+                    Cell{State::RequestedPagers, "page 0개 중 2: Alarm, How to use Alarm"},
+                    Cell{State::Nothing, "nothing"}),
+    ChangeTest::nameOfCell);
+
+TEST_P(LostMenuFile, EmptiesTheListUntilItIsBack) {
+    reachState();
+    remove();
+    setLanguage(Language::Korean);
+    comeToRest();
+    EXPECT_EQ(top(), GetParam().top);
+    EXPECT_THAT(newErrors(), ElementsAre(failure()));
+    if (hasList()) {
+        expectTheListToRecover();
+    } else {
+        writeMenuFile(tips::atFirst());
+        setLanguage(Language::Korean);
+    }
+    expectToWork(tips::atFirst(), Language::Korean);
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+/// There is one tip more, which a change of the theme has the list find, from the cache; the cache has no texts of it.
+/// A change of the language reads all files. Pages that were there before the list hear of the theme before it, and
+/// count what there was.
+class LargerCatalogue : public CatalogueChange {};
+
+INSTANTIATE_TEST_SUITE_P(Changes, LargerCatalogue,
+                         testing::Values(Cell{State::List, "list Tips: Tips and guidelines"},
+                                         Cell{State::ScrolledList, "list Tips: Steps"},
+                                         Cell{State::PagerComes, "page Tips 2/13: Alarm, How to use Alarm"},
+                                         Cell{State::PagerAtRest, "page Tips 3/13: Snooze, How to use Snooze"},
+                                         Cell{State::PicturesPlay, "page Tips 2/13: Alarm, How to use Alarm"},
+                                         Cell{State::FingerSwipes, "page Tips 4/13: Music, How to use Music"},
+                                         Cell{State::PagesGlide, "page Tips 4/13: Music, How to use Music"},
+                                         Cell{State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::Nothing, "nothing"}),
+                         ChangeTest::nameOfCell);
+
+TEST_P(LargerCatalogue, ShowsStepByStep) {
+    expectToShowStepByStep(tips::with(tips::atFirst(), "Torch"));
+}
+
+/// There is one tip less. Where a page stays open, its title is that of the tip that stands at its place now, as the
+/// title is written at every change of the theme, and its text is still the one that it was filled with.
+class SmallerCatalogue : public CatalogueChange {};
+
+INSTANTIATE_TEST_SUITE_P(Changes, SmallerCatalogue,
+                         testing::Values(Cell{State::List, "list Tips: Tips and guidelines"},
+                                         Cell{State::ScrolledList, "list Tips: Heart"},
+                                         Cell{State::PagerComes, "page Tips 2/11: Alarm, How to use Alarm"},
+                                         Cell{State::PagerAtRest, "page Tips 3/11: Snooze, How to use Snooze"},
+                                         Cell{State::PicturesPlay, "page Tips 2/11: Alarm, How to use Alarm"},
+                                         Cell{State::FingerSwipes, "page Tips 4/11: Mail, How to use Music"},
+                                         Cell{State::PagesGlide, "page Tips 4/11: Mail, How to use Music"},
+                                         Cell{State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::Nothing, "nothing"}),
+                         ChangeTest::nameOfCell);
+
+TEST_P(SmallerCatalogue, ShowsStepByStep) {
+    expectToShowStepByStep(tips::without(tips::atFirst(), "Music"));
+}

@@ -1,0 +1,174 @@
+#include "States.h"
+
+#include <algorithm>
+#include <map>
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace {
+
+// Places in the list as it is at first.
+constexpr std::size_t alarmRow = 1;
+constexpr std::size_t snoozeRow = 2;
+
+}  // namespace
+
+std::string nameOf(State state) {
+    static const std::map<State, std::string> names = {
+        {State::List, "OnTheList"},
+        {State::ScrolledList, "OnTheScrolledList"},
+        {State::PagerComes, "WhileAPagerComes"},
+        {State::PagerAtRest, "OnAPager"},
+        {State::PicturesPlay, "WhilePicturesPlay"},
+        {State::FingerSwipes, "WhileAFingerSwipes"},
+        {State::PagesGlide, "WhilePagesGlide"},
+        {State::RequestedPagerComes, "WhileARequestedPagerComes"},
+        {State::RequestedPager, "OnARequestedPager"},
+        {State::RequestedPagers, "OnRequestedPagers"},
+        {State::Nothing, "OnNothing"},
+    };
+    return names.at(state);
+}
+
+std::vector<Cell> ChangeTest::cellsWhereNothingMoves() {
+    return {
+        {State::List, "list Tips: Tips and guidelines"},
+        {State::ScrolledList, "list Tips: Steps"},
+        {State::PagerComes, "page Tips 2/12: Alarm, How to use Alarm"},
+        {State::PagerAtRest, "page Tips 3/12: Snooze, How to use Snooze"},
+        {State::PicturesPlay, "page Tips 2/12: Alarm, How to use Alarm"},
+        {State::FingerSwipes, "page Tips 4/12: Music, How to use Music"},
+        {State::PagesGlide, "page Tips 4/12: Music, How to use Music"},
+        {State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
+        {State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
+        {State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+        {State::Nothing, "nothing"},
+    };
+}
+
+std::vector<Cell> ChangeTest::cellsWhereThePagerCloses() {
+    return {
+        {State::List, "list Tips: Tips and guidelines"},
+        {State::ScrolledList, "list Tips: Tips and guidelines"},
+        {State::PagerComes, "list Tips: Tips and guidelines"},
+        {State::PagerAtRest, "list Tips: Tips and guidelines"},
+        {State::PicturesPlay, "list Tips: Tips and guidelines"},
+        {State::FingerSwipes, "list Tips: Tips and guidelines"},
+        {State::PagesGlide, "list Tips: Tips and guidelines"},
+        {State::RequestedPagerComes, "list Tips: Tips and guidelines"},
+        {State::RequestedPager, "list Tips: Tips and guidelines"},
+        {State::RequestedPagers, "page Tips 2/12: Alarm, How to use Alarm"},
+        {State::Nothing, "nothing"},
+    };
+}
+
+void ChangeTest::openRow(std::size_t menu, double seconds) {
+    begin();
+    tapRow(menu);
+    test_ui::runFor(seconds);
+    ASSERT_EQ(topView(), "KestContentView");
+}
+
+void ChangeTest::reachState() {
+    switch (GetParam().state) {
+    case State::List:
+        begin();
+        break;
+    case State::ScrolledList:
+        begin();
+        screen().swipe({300, 1100}, {300, 300}, 0.1);
+        test_ui::runFor(2);
+        ASSERT_NE(top(), "list Tips: Tips and guidelines");
+        break;
+    case State::PagerComes:
+        openRow(alarmRow, 0.1);
+        break;
+    case State::PagerAtRest:
+        openRow(snoozeRow, 1.5);
+        break;
+    case State::PicturesPlay:
+        openRow(alarmRow, 4);
+        ASSERT_EQ(pictureInView(), 1);
+        break;
+    case State::FingerSwipes:
+        openRow(snoozeRow, 1.5);
+        screen().press({600, 400});
+        for (int x = 550; x >= 150; x -= 50) {
+            test_ui::runFor(0.02);
+            screen().moveTo({x, 400});
+        }
+        fingerIsDown_ = true;
+        break;
+    case State::PagesGlide:
+        openRow(snoozeRow, 1.5);
+        swipeToTheNextPage();
+        test_ui::runFor(0.1);
+        break;
+    case State::RequestedPagerComes:
+        beginAtOnce({"appID=com.example.alarm", "page=2"});
+        test_ui::runFor(0.1);
+        break;
+    case State::RequestedPager:
+        begin({"appID=com.example.alarm", "page=2"});
+        break;
+    case State::RequestedPagers:
+        begin({"appID=com.example.alarm"});
+        break;
+    case State::Nothing:
+        begin({"appID=com.example.nobody"});
+        break;
+    }
+    newRecords();
+    EXPECT_THAT(newErrors(), IsEmpty());
+}
+
+void ChangeTest::comeToRest() {
+    test_ui::runFor(1);
+    if (fingerIsDown_)
+        screen().lift();
+    fingerIsDown_ = false;
+    test_ui::runFor(1);
+}
+
+void ChangeTest::expectToWork(const Names& names, Language language) {
+    expectTheWayBack();
+    if (hasList()) {
+        EXPECT_EQ(rows(), rowsOf(names, language));
+        expectTipsToOpen(names, language);
+        return;
+    }
+    request({{"appID", "com.ravella.kest"}, {"page", "99"}});
+    test_ui::runFor(1);
+    EXPECT_EQ(top(), "nothing");
+    request({{"appID", "com.example.alarm"}, {"page", "2"}});
+    test_ui::runFor(1);
+    EXPECT_EQ(top(), pageOf("Snooze", names, language));
+    EXPECT_THAT(newRecords(), ElementsAre("KT03 " + tips::title("Snooze", language)));
+}
+
+void ChangeTest::expectTheWayBack() {
+    for (unsigned int left = levels(); left > 1; --left) {
+        ASSERT_EQ(levels(), left);
+        ASSERT_EQ(topView(), "KestContentView");
+        back();
+        test_ui::runFor(0.7);
+    }
+    EXPECT_FALSE(test_ui::hasEnded());
+    EXPECT_EQ(topView(), hasList() ? "KestMainView" : "");
+    EXPECT_THAT(newRecords(), IsEmpty());
+}
+
+void ChangeTest::expectTipsToOpen(const Names& names, Language language) {
+    // Behind every place at which tips come and go, and the last one.
+    for (const std::string& name : {std::string("Mail"), names.back()}) {
+        tapRow(static_cast<std::size_t>(std::find(names.begin(), names.end(), name) - names.begin()));
+        test_ui::runFor(0.35);
+        EXPECT_EQ(top(), pageOf(name, names, language));
+        EXPECT_THAT(newRecords(), ElementsAre("KT01 " + tips::title(name, language)));
+        back();
+        test_ui::runFor(0.7);
+        EXPECT_EQ(topView(), "KestMainView");
+    }
+    EXPECT_THAT(newRecords(), IsEmpty());
+}
