@@ -1,16 +1,14 @@
-#include "Calls.h"
+#include "NotedCalls.h"
 
 #include <Elementary.h>
 #include <app-assist/WApp.h>
 #include <app-assist/WAppEventHandler.h>
 #include <app_extension.h>
 #include <app_resource_manager.h>
-#include <notification.h>
 #include <ravella-log-client.h>
 #include <ui_extension.h>
 
 #include <algorithm>
-#include <sstream>
 #include <utility>
 
 namespace {
@@ -20,26 +18,14 @@ std::set<std::string> failing;
 bool rotationSupported = false;
 std::function<void()> lookWhenTheLanguageIsSet;
 
-std::string orNull(const char* text) {
-    return text ? text : "null";
-}
-std::string orNull(const void* handle, const char* name) {
-    return handle ? name : "null";
-}
-
-template <class... Arguments>
-void note(const Arguments&... arguments) {
-    std::ostringstream line;
-    const char* separator = "";
-    ((line << separator << arguments, separator = " "), ...);
-    all.push_back(line.str());
-}
-
 bool fails(const std::string& name) {
     return failing.count(name) > 0;
 }
 
 }  // namespace
+
+using calls::note;
+using calls::orNull;
 
 const std::vector<std::string>& calls::made() {
     return all;
@@ -51,6 +37,10 @@ std::vector<std::string> calls::madeOf(const std::vector<std::string>& names) {
         if (std::any_of(names.begin(), names.end(), [&](const std::string& name) { return line.rfind(name, 0) == 0; }))
             found.push_back(line);
     return found;
+}
+
+void calls::add(std::string line) {
+    all.push_back(std::move(line));
 }
 
 void calls::forget() {
@@ -68,12 +58,6 @@ void calls::whenTheLanguageIsSet(std::function<void()> look) {
 void calls::setRotationSupported(bool supported) {
     rotationSupported = supported;
 }
-
-// Each call is noted under its own name, then goes through.
-#define CALL(result, name, ...)                                                                                        \
-    extern "C" result __real_##name(__VA_ARGS__);                                                                      \
-    extern "C" result __wrap_##name(__VA_ARGS__);                                                                      \
-    result __wrap_##name(__VA_ARGS__)
 
 // WAppEventHandler::addEventHandler(), which the linker knows by this name. The object that it is called on goes first.
 #define ADD_EVENT_HANDLER                                                                                              \
@@ -267,61 +251,4 @@ CALL(void, uxt_theme_object_set_color_table, Evas_Object* object, uxt_color_tabl
 CALL(void, uxt_theme_object_set_font_table, Evas_Object* object, uxt_font_table_h table) {
     note("uxt_theme_object_set_font_table", orNull(object, "object"), orNull(table, "table"));
     __real_uxt_theme_object_set_font_table(object, table);
-}
-
-CALL(int, app_control_create, app_control_h* request) {
-    note("app_control_create");
-    return __real_app_control_create(request);
-}
-
-CALL(int, app_control_destroy, app_control_h request) {
-    note("app_control_destroy");
-    return __real_app_control_destroy(request);
-}
-
-CALL(int, app_control_set_app_id, app_control_h request, const char* id) {
-    note("app_control_set_app_id", id);
-    return __real_app_control_set_app_id(request, id);
-}
-
-CALL(notification_h, notification_create, notification_type_e type) {
-    note("notification_create", type);
-    return __real_notification_create(type);
-}
-
-CALL(int, notification_free, notification_h notification) {
-    note("notification_free");
-    return __real_notification_free(notification);
-}
-
-CALL(int, notification_set_layout, notification_h notification, notification_ly_type_e layout) {
-    note("notification_set_layout", layout);
-    return __real_notification_set_layout(notification, layout);
-}
-
-CALL(int, notification_set_text, notification_h notification, notification_text_type_e type, const char* text,
-     const char* key, int args, ...) {
-    note("notification_set_text", type, text, key, args);
-    return __real_notification_set_text(notification, type, text, key, args);
-}
-
-CALL(int, notification_set_image, notification_h notification, notification_image_type_e type, const char* path) {
-    note("notification_set_image", type, orNull(path));
-    return __real_notification_set_image(notification, type, path);
-}
-
-CALL(int, notification_set_launch_option, notification_h notification, notification_launch_option_type_e type,
-     void* option) {
-    note("notification_set_launch_option", type, orNull(option, "request"));
-    return __real_notification_set_launch_option(notification, type, option);
-}
-
-CALL(int, notification_set_display_applist, notification_h notification, int places) {
-    note("notification_set_display_applist", places);
-    return __real_notification_set_display_applist(notification, places);
-}
-
-CALL(int, notification_post, notification_h notification) {
-    note("notification_post");
-    return __real_notification_post(notification);
 }
