@@ -7,6 +7,7 @@
 
 #include <string>
 
+class KestContentView;
 class KestMainView;
 
 namespace app_assist {
@@ -32,6 +33,7 @@ private:
     void __openMenus(const std::string& appId, long page, bool firstLaunch);
     /// False when there is nothing to open it on.
     bool __openMenu(int menu, bool firstLaunch);
+    static void __turnPager(app_assist::WNaviframe& naviframe, KestContentView& pager, int menu);
     /// Null without a window, or when the window is closed.
     app_assist::WNaviframe* __naviframe() const;
     /// Frees a list that never came onto the naviframe.

@@ -21,6 +21,8 @@ public:
     bool isFilled() const { return entry != nullptr; }
     /// The page has become the one in view: writes its number into the title bar and starts its demonstration over.
     void onViewDisplay(Elm_Object_Item* naviItem);
+    /// Another page than the pager was opened at is the chosen one from now on.
+    void setDisplayIndex(int chosenIndex) { displayIndex = chosenIndex; }
     /// A swipe begins: ends the demonstration and puts the pictures back to their start.
     void onPageScrollStart();
 

@@ -3,6 +3,8 @@
 #include <app-assist/WPageSlideView.h>
 
 #include <cstdint>
+#include <string>
+#include <vector>
 
 namespace app_assist {
 class KestContentSubView;
@@ -19,6 +21,8 @@ public:
 
     /// Shows menu `index` (from 0) at once. Called for a launch request while the pager is open.
     void showContentsPage(int index);
+    /// False when the catalogue has other menus by now than the pager was made for.
+    bool isOfCatalogue() const;
 
     /// A catalogue has no more menus than this.
     static const std::int32_t mostPages = 15;
@@ -55,6 +59,8 @@ private:
     app_assist::KestContentSubView* pages[mostPages];
     std::int32_t pageCount;
     bool pushOnTop;
+    /// Which menus the pages are for, in their order.
+    std::vector<std::string> menuKeys;
     /// How many of the pages were handed to the base.
     std::int32_t appended;
     /// The menu whose page is displayed; -1 while none has come to rest.

@@ -180,11 +180,23 @@ bool KestApp::__openMenu(int menu, bool firstLaunch) {
     }
     app_assist::WView* top = naviframe->getTopView();
     if (top && top != mainView) {
-        static_cast<KestContentView*>(top)->showContentsPage(menu);
+        __turnPager(*naviframe, *static_cast<KestContentView*>(top), menu);
     } else {
         naviframe->push(new KestContentView(listIndex, false), nullptr, nullptr);
     }
     return true;
+}
+
+void KestApp::__turnPager(app_assist::WNaviframe& naviframe, KestContentView& pager, int menu) {
+    if (pager.isOfCatalogue()) {
+        pager.showContentsPage(menu);
+        return;
+    }
+    // Its pages stand for menus that have moved meanwhile.
+    naviframe.push(new KestContentView(menu + firstMenuIndex, false), nullptr, nullptr);
+    if (!naviframe.isTopView(&pager)) {
+        elm_object_item_del(pager.getNaviItem());
+    }
 }
 
 app_assist::WNaviframe* KestApp::__naviframe() const {

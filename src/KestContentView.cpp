@@ -24,16 +24,25 @@ const double secondsToOtherPages = 0.4;
 
 const std::int32_t noMenu = -1;
 
+/// What tells menus apart, in their order.
+std::vector<std::string> keysOfCatalogue() {
+    std::vector<std::string> keys;
+    for (const KestContentInfo& record : KestContentMgr::getInstance()->getContentsList()) {
+        keys.push_back(record.appid + " " + record.path);
+    }
+    return keys;
+}
+
 }  // namespace
 
 const std::int32_t KestContentView::mostPages;
 
 KestContentView::KestContentView(int listIndex, bool onTop)
-    : __selectedView(listIndex - firstMenuIndex), pages(), pageCount(0), pushOnTop(onTop), appended(0),
-      displayed(noMenu), going(false) {
+    : __selectedView(listIndex - firstMenuIndex), pages(), pageCount(0), pushOnTop(onTop), menuKeys(keysOfCatalogue()),
+      appended(0), displayed(noMenu), going(false) {
     KEST_BEGIN();
     KEST_INFO("__selectedView:%d", __selectedView);
-    const size_t menus = KestContentMgr::getInstance()->getContentsList().size();
+    const size_t menus = menuKeys.size();
     WASSERT_EX(menus <= static_cast<size_t>(mostPages), "(menus <= mostPages)",
                "the catalogue has %zu menus, more than the %d pages of the pager", menus, mostPages);
     pageCount = static_cast<std::int32_t>(menus);
@@ -181,10 +190,19 @@ void KestContentView::showContentsPage(int index) {
     KEST_HIT();
     __selectedView = index;
     KEST_INFO("change view page to %d", __selectedView);
+    for (std::int32_t menu = 0; menu < pageCount; ++menu) {
+        if (KestContentSubView* page = __pageAt(menu)) {
+            page->setDisplayIndex(__selectedView);
+        }
+    }
     if (__pageAt(__selectedView)) {
         showPage(__placeOf(__selectedView), false);
         __display(__selectedView, getNaviItem());
     }
+}
+
+bool KestContentView::isOfCatalogue() const {
+    return menuKeys == keysOfCatalogue();
 }
 
 void KestContentView::__backCb(void* data, Evas_Object*, void*) {

@@ -1,10 +1,25 @@
 #include "RequestTest.h"
 
+#include "KestContentMgr.h"
+
+#include <device/Keys.h>
+
 using testing::Contains;
 using testing::ElementsAre;
 
 /// Requests to an application that runs.
-class LaterRequest : public RequestTest {};
+class LaterRequest : public RequestTest {
+protected:
+    /// The title on the page that is in view.
+    std::string titleInView() {
+        for (const Evas_Object* label : test_ui::widgets(naviframe().getTopView()->getEvasObj(), "Elm_Label")) {
+            const test_ui::Point middle = test_ui::geometry(label).middle();
+            if (middle.x >= 0 && middle.x < 720)
+                return test_ui::plainText(label);
+        }
+        return "";
+    }
+};
 
 TEST_F(LaterRequest, LeavesTheScreenAsItIsWhereItNamesNoApplication) {
     writeCatalogue();
@@ -55,6 +70,63 @@ TEST_F(LaterRequest, TurnsThePagerBeforeTheListHasComeInBeneathIt) {
     settle();
     EXPECT_THAT(titles(), ElementsAre("Tips", "Tips 4/4"));
     EXPECT_THAT(usage(), ElementsAre("KT03 Clock", "KT03 Lock"));
+}
+
+TEST_F(LaterRequest, OpensANewPagerInPlaceOfOneOfAnOlderCatalogue) {
+    writeCatalogue();
+    start({std::string("appID=") + doorId});
+    ASSERT_THAT(titles(), ElementsAre("Tips", "Tips 1/4", "Tips 3/4", "Tips 4/4"));
+    writeMenus({{"contents/Lock.xml", doorId}, {"contents/Clock.xml", clockId}});
+    KestContentMgr::getInstance()->loadContentsList(true);
+    request({{"appID", clockId}});
+    EXPECT_THAT(titles(), ElementsAre("Tips", "Tips 1/4", "Tips 3/4", "Tips 2/2"));
+    EXPECT_THAT(titleInView(), testing::HasSubstr("Clock"));
+    EXPECT_EQ(usage().back(), "KT03 Clock");
+    EXPECT_THAT(kest_log::ofLevel('E', newLog()), testing::IsEmpty());
+    naviframe().back();
+    settle();
+    EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView", "KestContentView"));
+}
+
+TEST_F(LaterRequest, IsForAMenuThatHasComeSinceThePagerOpened) {
+    writeCatalogue();
+    writeMenus({{"contents/Open.xml", doorId}});
+    start({std::string("appID=") + doorId});
+    writeCatalogue();
+    KestContentMgr::getInstance()->loadContentsList(true);
+    request({{"appID", clockId}});
+    EXPECT_THAT(titles(), ElementsAre("Tips", "Tips 2/4"));
+}
+
+TEST_F(LaterRequest, HasItsPageKeepItsNumberWhenTheThemeChanges) {
+    writeCatalogue();
+    start({std::string("appID=") + clockId});
+    request({{"appID", doorId}, {"page", "3"}});
+    device()->settings().set(device::keys::theme, "dark");
+    settle();
+    EXPECT_THAT(titles(), ElementsAre("Tips", "Tips 4/4"));
+}
+
+TEST_F(LaterRequest, HasNoTransition) {
+    writeCatalogue();
+    start();
+    int finished = 0;
+    evas_object_smart_callback_add(
+        naviframe().getEvasObj(), "transition,finished",
+        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    request({{"appID", clockId}});
+    EXPECT_EQ(finished, 0);
+    naviframe().back();
+    settle();
+    EXPECT_EQ(finished, 1) << "this one has";
+}
+
+TEST_F(LaterRequest, ToAnEmptyScreenLeavesNothingToGoBackTo) {
+    writeCatalogue();
+    start({"appID=com.example.none"});
+    request({{"appID", clockId}});
+    test_ui::inMainLoop([&] { naviframe().back(); });
+    EXPECT_TRUE(test_ui::hasEnded());
 }
 
 TEST_F(LaterRequest, OpensTheTipAnewWhenThePagerWasClosed) {
