@@ -6,14 +6,52 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
+#include <fcntl.h>
+#include <stdexcept>
+#include <string>
 #include <sys/wait.h>
+#include <unistd.h>
+#include <vector>
 
 namespace {
 
 using device::Presenter;
+using testing::Contains;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
+using testing::SizeIs;
+
+/// Returns when the program is loaded, which no folder keeps from another user.
+device::Process startForNobody(std::vector<std::string> words) {
+    constexpr uid_t nobody = 65534;
+    const int program = open(words[0].c_str(), O_PATH | O_CLOEXEC);
+    std::vector<char*> pointers;
+    for (std::string& word : words)
+        pointers.push_back(word.data());
+    pointers.push_back(nullptr);
+    std::array<int, 2> loaded{};
+    if (program < 0 || pipe2(loaded.data(), O_CLOEXEC) != 0)
+        throw std::runtime_error("the program cannot be started for another user");
+    const pid_t id = fork();
+    if (id == 0) {
+        if (setuid(nobody) == 0)
+            fexecve(program, pointers.data(), environ);
+        _exit(1);
+    }
+    close(program);
+    close(loaded[1]);
+    char none = 0;
+    // Its end of the pipe closes when it has become the other program.
+    while (read(loaded[0], &none, 1) > 0) {
+    }
+    close(loaded[0]);
+    device::Process process(id);
+    while (process.runs() && process.arguments().size() != words.size()) {
+    }
+    return process;
+}
 
 /// Another program stands in for the one that shows notifications.
 class Presenting : public testing::Test {
@@ -80,6 +118,31 @@ TEST_F(Presenting, LeavesOtherDevicesAndOtherProgramsAlone) {
     EXPECT_THAT(idsOf(elsewhere.shown()), IsEmpty());
     EXPECT_THAT(idsOf(presenter_.takeAllDown()), ElementsAre(1));
     EXPECT_THAT(idsOf(others.takeAllDown()), ElementsAre(1));
+}
+
+TEST_F(Presenting, LeavesProgramsOfOtherUsersAlone) {
+    if (geteuid() != 0)
+        GTEST_SKIP() << "only root can start a program for another user";
+    presenter_.show(1);
+    const device::Process others = startForNobody({WAITING_PROGRAM, device_.root().string(), "2"});
+    EXPECT_THAT(shown(), ElementsAre(1));
+    EXPECT_THAT(idsOf(presenter_.takeAllDown()), ElementsAre(1));
+    EXPECT_TRUE(others.runs());
+    others.end();
+}
+
+TEST_F(Presenting, ShowsNoMoreThanTwentyAtOnce) {
+    for (int id = 1; id <= 20; ++id)
+        presenter_.show(id);
+    presenter_.show(21);
+    EXPECT_THAT(shown(), SizeIs(20));
+    EXPECT_THAT(device_.logMessages(),
+                ElementsAre("W NOTIFICATION notification 21: not shown on the desktop, which shows 20 of this device "
+                            "already"));
+    presenter_.takeDown(4);
+    presenter_.show(22);
+    EXPECT_THAT(shown(), SizeIs(20));
+    EXPECT_THAT(shown(), Contains(22));
 }
 
 TEST_F(Presenting, WithoutAProgramShowsNothing) {

@@ -8,13 +8,18 @@
 #include <chrono>
 #include <cstdlib>
 #include <string>
+#include <sys/stat.h>
 #include <system_error>
 #include <thread>
+#include <unistd.h>
 
 namespace device {
 namespace {
 
 namespace fs = std::filesystem;
+
+/// Each costs the desktop a process and one of the few inotify instances that a user has.
+constexpr std::size_t mostAtOnce = 20;
 
 /// 0 for a text that is none.
 long long numberIn(const std::string& text) {
@@ -23,11 +28,17 @@ long long numberIn(const std::string& text) {
     return *end == '\0' && number > 0 ? number : 0;
 }
 
-std::vector<Process> allProcesses() {
+bool isOwn(const fs::path& file) {
+    struct stat status = {};
+    return stat(file.c_str(), &status) == 0 && status.st_uid == geteuid();
+}
+
+/// Anybody may run a program with any words, and nobody can end another user's.
+std::vector<Process> processesOfThisUser() {
     std::vector<Process> processes;
     std::error_code error;
     for (fs::directory_iterator entry("/proc", error), end; !error && entry != end; entry.increment(error))
-        if (const long long id = numberIn(entry->path().filename()); id > 0)
+        if (const long long id = numberIn(entry->path().filename()); id > 0 && isOwn(entry->path()))
             processes.emplace_back(static_cast<int>(id));
     return processes;
 }
@@ -44,6 +55,12 @@ void waitForItsWords(const Process& process) {
 void Presenter::show(long long id) {
     if (program_.empty())
         return;
+    if (shown().size() >= mostAtOnce) {
+        log_.write(Log::Level::Warning, "NOTIFICATION",
+                   "notification " + std::to_string(id) + ": not shown on the desktop, which shows " +
+                       std::to_string(mostAtOnce) + " of this device already");
+        return;
+    }
     try {
         Program program;
         program.words = {program_.string(), folder_.root().string(), std::to_string(id)};
@@ -58,7 +75,7 @@ void Presenter::show(long long id) {
 
 std::vector<Presenter::Shown> Presenter::shown() const {
     std::vector<Shown> shown;
-    for (const Process& process : allProcesses()) {
+    for (const Process& process : processesOfThisUser()) {
         const std::vector<std::string> words = process.arguments();
         // Another build's program of the same name may show this device's notifications too.
         const bool isOurs = words.size() == 3 && fs::path(words[0]).filename() == program_.filename() &&
