@@ -27,6 +27,7 @@ settings, packages, log and screen.")
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(runtime
   dbus-daemon               # a device's private bus where there is no session bus
+  desktop-file-utils        # writes the desktop's table of who opens links
   libevas1-engines-x        # windows on X11
   libevas1-engines-wayland
   fontconfig                # the fonts' cache: without it every first start reads all of them
