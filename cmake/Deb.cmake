@@ -7,6 +7,7 @@ set(CPACK_PACKAGE_DIRECTORY "${CMAKE_BINARY_DIR}")
 # All places are absolute: a device's own are, whatever the prefix.
 set(CPACK_SET_DESTDIR ON)
 set(CPACK_INSTALL_PREFIX "${CMAKE_INSTALL_PREFIX}")
+set(CPACK_PRE_BUILD_SCRIPTS "${CMAKE_CURRENT_LIST_DIR}/DebFolders.cmake")
 
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
 # The packages share one program, and this compression finds that out.

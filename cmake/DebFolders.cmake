@@ -1,0 +1,8 @@
+# The prefix's folder of a package, which is made before anything is installed to it, follows the umask.
+file(GLOB_RECURSE entries LIST_DIRECTORIES true "${CPACK_TEMPORARY_DIRECTORY}/*")
+foreach(entry IN LISTS entries)
+  if(IS_DIRECTORY "${entry}" AND NOT IS_SYMLINK "${entry}")
+    file(CHMOD "${entry}"
+      PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE WORLD_READ WORLD_EXECUTE)
+  endif()
+endforeach()
