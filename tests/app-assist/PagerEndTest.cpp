@@ -15,6 +15,12 @@ protected:
         test_ui::inMainLoop([this] { elm_naviframe_item_pop(naviframe_.getEvasObj()); });
     }
     std::string top() const { return naviframe_.getTopView()->getClassName(); }
+    unsigned int levels() const {
+        Eina_List* items = elm_naviframe_items_get(naviframe_.getEvasObj());
+        const unsigned int count = eina_list_count(items);
+        eina_list_free(items);
+        return count;
+    }
     /// Lets everything come to rest, and asserts that the list is what is left, alive to a touch.
     void expectOnlyTheList() {
         test_ui::runFor(2.0);
@@ -31,8 +37,21 @@ TEST_F(PagerEnd, ComesWhenItHasMovedInIfItWasPoppedBefore) {
     openTips(2);
     test_ui::runFor(0.1);
     pop();
-    EXPECT_NE("list", top());
+    EXPECT_EQ(2U, levels());
+    EXPECT_EQ("list", top());
     expectOnlyTheList();
+}
+
+TEST_F(PagerEnd, LetsAViewThatIsPushedMeanwhileStay) {
+    openTips(2);
+    test_ui::runFor(0.1);
+    pop();
+    naviframe_.push(new TellingView("next", story_), nullptr, nullptr);
+    EXPECT_EQ("next", top());
+    test_ui::runFor(2.0);
+    EXPECT_EQ("next", top());
+    EXPECT_EQ(2U, levels());
+    EXPECT_EQ(tips_.size(), static_cast<size_t>(std::count_if(story_.begin(), story_.end(), isDeletion)));
 }
 
 TEST_F(PagerEnd, ComesOnceFromTwoPopsWhileItMovesIn) {
@@ -48,7 +67,7 @@ TEST_F(PagerEnd, ComesFromTheBackKeyWhileItMovesIn) {
     screen().key("Shift_L");
     openTips(2);
     screen().key("XF86Back");
-    EXPECT_NE("list", top());
+    EXPECT_EQ(2U, levels());
     expectOnlyTheList();
 }
 

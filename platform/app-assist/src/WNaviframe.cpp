@@ -3,6 +3,7 @@
 #include "BackKeys.h"
 #include "Guarded.h"
 #include "app-assist/WView.h"
+#include "efl-answers/RefusedPop.h"
 
 #include <algorithm>
 #include <utility>
@@ -13,6 +14,21 @@ namespace {
 
 /// Under this name the Evas object knows its WNaviframe.
 constexpr char selfKey[] = "app_assist::WNaviframe";
+
+/// The item that is about to be popped as soon as it has moved in; null when there is none.
+Elm_Object_Item* goingItem(const Evas_Object* naviframe) {
+    return static_cast<Elm_Object_Item*>(evas_object_data_get(naviframe, efl_answers::refusedPopKey));
+}
+
+/// Null for the lowest.
+Elm_Object_Item* itemBeneath(const Evas_Object* naviframe, const Elm_Object_Item* item) {
+    Eina_List* items = elm_naviframe_items_get(naviframe);
+    const Eina_List* node = eina_list_data_find_list(items, item);
+    const Eina_List* beneath = node ? eina_list_prev(node) : nullptr;
+    auto* found = static_cast<Elm_Object_Item*>(beneath ? eina_list_data_get(beneath) : nullptr);
+    eina_list_free(items);
+    return found;
+}
 
 }  // namespace
 
@@ -79,10 +95,13 @@ bool WNaviframe::putOnStack(WView& view, const char* title, void* viewParam) {
     if (!view.create(naviframe_, viewParam))
         return false;
     view.onSetContainerProperties(naviframe_);
+    Elm_Object_Item* going = goingItem(naviframe_);
     Elm_Object_Item* item = view.onPushToNaviframe(naviframe_);
     if (life.expired() || !item)
         return false;
     adopt(view, item);
+    if (going && elm_naviframe_top_item_get(naviframe_) != going)
+        takeAway(going);
     if (title)
         elm_object_item_text_set(item, title);
     view.onPushed(item);
@@ -125,10 +144,20 @@ void WNaviframe::viewGone(const WView& view) {
     std::erase(views_, &view);
     if (announced_ == &view)
         announced_ = nullptr;
-    if (!naviframe_ || !view.naviItem_)
-        return;
     // The item is either about to go with its view, or it stays behind without content and must go too.
-    emptyItems_.push_back(view.naviItem_);
+    if (naviframe_ && view.naviItem_)
+        deleteSoon(view.naviItem_);
+}
+
+/// One that was to be popped and is covered now: its pop would come to nothing.
+void WNaviframe::takeAway(Elm_Object_Item* item) {
+    evas_object_data_del(naviframe_, efl_answers::refusedPopKey);
+    if (itemPops(this, item))
+        deleteSoon(item);
+}
+
+void WNaviframe::deleteSoon(Elm_Object_Item* item) {
+    emptyItems_.push_back(item);
     if (!emptyItemsJob_)
         emptyItemsJob_ = ecore_job_add([](void* self) { static_cast<WNaviframe*>(self)->deleteEmptyItems(); }, this);
 }
@@ -164,6 +193,9 @@ WView* WNaviframe::viewOf(const Elm_Object_Item* item) const {
 
 WView* WNaviframe::getTopView() const {
     const Elm_Object_Item* item = naviframe_ ? elm_naviframe_top_item_get(naviframe_) : nullptr;
+    if (item && item == goingItem(naviframe_))
+        if (const Elm_Object_Item* beneath = itemBeneath(naviframe_, item))
+            item = beneath;
     return item ? viewOf(item) : nullptr;
 }
 

@@ -1,10 +1,12 @@
 #include "Original.h"
+#include "efl-answers/RefusedPop.h"
 
 #include <Elementary.h>
 
 namespace {
 
-constexpr char refusedKey[] = "efl_answers::refusedPop";
+using efl_answers::refusedPopKey;
+
 constexpr char askedKey[] = "efl_answers::asked";
 
 /// What an item's owner has to say to its being popped.
@@ -29,7 +31,7 @@ Elm_Object_Item* pop(Evas_Object* naviframe) {
 }
 
 void popWhatWasRefused(void*, Evas_Object* naviframe, void*) {
-    const void* refused = evas_object_data_del(naviframe, refusedKey);
+    const void* refused = evas_object_data_del(naviframe, refusedPopKey);
     evas_object_smart_callback_del(naviframe, "transition,finished", popWhatWasRefused);
     if (elm_naviframe_top_item_get(naviframe) == refused)
         pop(naviframe);
@@ -61,8 +63,8 @@ extern "C" Elm_Object_Item* elm_naviframe_item_pop(Evas_Object* naviframe) {
     Elm_Object_Item* popped = pop(naviframe);
     const bool wasAsked = evas_object_data_del(naviframe, askedKey) == top;
     const bool refused = top && !wasAsked && elm_naviframe_top_item_get(naviframe) == top;
-    if (refused && !evas_object_data_get(naviframe, refusedKey)) {
-        evas_object_data_set(naviframe, refusedKey, top);
+    if (refused && !evas_object_data_get(naviframe, refusedPopKey)) {
+        evas_object_data_set(naviframe, refusedPopKey, top);
         evas_object_smart_callback_add(naviframe, "transition,finished", popWhatWasRefused, nullptr);
     }
     return popped;

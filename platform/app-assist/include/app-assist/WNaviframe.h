@@ -29,6 +29,7 @@ public:
     /// the stack is freed, with an error line in the log.
     void push(WView* view, const char* title, void* viewParam);
 
+    /// The view that shows, or that will when the one above it, which was popped while it was still moving in, is gone.
     /// Null when the stack is empty.
     WView* getTopView() const;
     bool isTopView(const WView* view) const { return view && getTopView() == view; }
@@ -42,6 +43,8 @@ private:
     bool putOnStack(WView& view, const char* title, void* viewParam);
     void adopt(WView& view, Elm_Object_Item* item);
     void viewGone(const WView& view);
+    void takeAway(Elm_Object_Item* item);
+    void deleteSoon(Elm_Object_Item* item);
     void announceTop();
     void deleteEmptyItems();
     WView* viewOf(const Elm_Object_Item* item) const;
@@ -53,7 +56,7 @@ private:
     Evas_Object* naviframe_ = nullptr;
     std::unique_ptr<BackKeys> backKeys_;
     std::vector<WView*> views_;
-    /// Items on the stack whose views are gone.
+    /// Items on the stack that are to go: their views are gone, or they were popped and are covered.
     std::vector<Elm_Object_Item*> emptyItems_;
     Ecore_Job* emptyItemsJob_ = nullptr;
     const WView* announced_ = nullptr;
