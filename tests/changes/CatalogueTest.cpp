@@ -81,7 +81,7 @@ INSTANTIATE_TEST_SUITE_P(
                     Cell{State::RequestedPagerComes, "list 팁: 팁 및 안내"},
                     Cell{State::RequestedPager, "list 팁: 팁 및 안내"},
                     Cell{State::RequestedPagers, "page 0개 중 2: Alarm, How to use Alarm"},
-                    Cell{State::Nothing, "nothing"}),
+                    Cell{State::TurnedPager, "list 팁: 팁 및 안내"}, Cell{State::Nothing, "nothing"}),
     ChangeTest::nameOfCell);
 
 TEST_P(LostMenuFile, EmptiesTheListUntilItIsBack) {
@@ -117,6 +117,7 @@ INSTANTIATE_TEST_SUITE_P(Changes, LargerCatalogue,
                                          Cell{State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
                                          Cell{State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
                                          Cell{State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::TurnedPager, "page Tips 4/12: Music, How to use Music"},
                                          Cell{State::Nothing, "nothing"}),
                          ChangeTest::nameOfCell);
 
@@ -139,6 +140,7 @@ INSTANTIATE_TEST_SUITE_P(Changes, SmallerCatalogue,
                                          Cell{State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
                                          Cell{State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
                                          Cell{State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+                                         Cell{State::TurnedPager, "page Tips 4/12: Music, How to use Music"},
                                          Cell{State::Nothing, "nothing"}),
                          ChangeTest::nameOfCell);
 

@@ -14,7 +14,8 @@ INSTANTIATE_TEST_SUITE_P(
                     Cell{State::PagesGlide, "list 팁: 팁 및 안내"},
                     Cell{State::RequestedPagerComes, "list 팁: 팁 및 안내"},
                     Cell{State::RequestedPager, "list 팁: 팁 및 안내"},
-                    Cell{State::RequestedPagers, "page 12개 중 2: 알람, 알람 사용법"}, Cell{State::Nothing, "nothing"}),
+                    Cell{State::RequestedPagers, "page 12개 중 2: 알람, 알람 사용법"},
+                    Cell{State::TurnedPager, "list 팁: 팁 및 안내"}, Cell{State::Nothing, "nothing"}),
     ChangeTest::nameOfCell);
 
 TEST_P(LanguageChange, IsReadEverywhere) {

@@ -26,6 +26,7 @@ std::string nameOf(State state) {
         {State::RequestedPagerComes, "WhileARequestedPagerComes"},
         {State::RequestedPager, "OnARequestedPager"},
         {State::RequestedPagers, "OnRequestedPagers"},
+        {State::TurnedPager, "OnAPagerThatARequestTurned"},
         {State::Nothing, "OnNothing"},
     };
     return names.at(state);
@@ -43,6 +44,7 @@ std::vector<Cell> ChangeTest::cellsWhereNothingMoves() {
         {State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
         {State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
         {State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
+        {State::TurnedPager, "page Tips 4/12: Music, How to use Music"},
         {State::Nothing, "nothing"},
     };
 }
@@ -59,6 +61,7 @@ std::vector<Cell> ChangeTest::cellsWhereThePagerCloses() {
         {State::RequestedPagerComes, "list Tips: Tips and guidelines"},
         {State::RequestedPager, "list Tips: Tips and guidelines"},
         {State::RequestedPagers, "page Tips 2/12: Alarm, How to use Alarm"},
+        {State::TurnedPager, "list Tips: Tips and guidelines"},
         {State::Nothing, "nothing"},
     };
 }
@@ -115,6 +118,11 @@ void ChangeTest::reachState() {
     case State::RequestedPagers:
         begin({"appID=com.example.alarm"});
         break;
+    case State::TurnedPager:
+        begin({"appID=com.example.alarm", "page=2"});
+        request({{"appID", "com.example.music"}});
+        test_ui::runFor(1);
+        break;
     case State::Nothing:
         begin({"appID=com.example.nobody"});
         break;
@@ -132,6 +140,8 @@ void ChangeTest::comeToRest() {
 }
 
 void ChangeTest::expectToWork(const Names& names, Language language) {
+    if (hasList() && std::count(names.begin(), names.end(), "Snooze"))
+        expectARequestToOpenItsTip(names, language);
     expectTheWayBack();
     if (hasList()) {
         EXPECT_EQ(rows(), rowsOf(names, language));
@@ -141,6 +151,10 @@ void ChangeTest::expectToWork(const Names& names, Language language) {
     request({{"appID", "com.ravella.kest"}, {"page", "99"}});
     test_ui::runFor(1);
     EXPECT_EQ(top(), "nothing");
+    expectARequestToOpenItsTip(names, language);
+}
+
+void ChangeTest::expectARequestToOpenItsTip(const Names& names, Language language) {
     request({{"appID", "com.example.alarm"}, {"page", "2"}});
     test_ui::runFor(1);
     EXPECT_EQ(top(), pageOf("Snooze", names, language));

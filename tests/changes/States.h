@@ -16,6 +16,7 @@ enum class State {
     RequestedPagerComes,
     RequestedPager,
     RequestedPagers,
+    TurnedPager,
     Nothing,
 };
 
@@ -32,7 +33,7 @@ struct Cell {
 };
 
 /// A change in every state. Where tips are opened before it: the second row ("Alarm", whose pictures play) where a
-/// pager comes or plays, else the third ("Snooze"), from which a swipe goes to the fourth ("Music").
+/// pager comes or plays, else the third ("Snooze"), from which a swipe or a request goes to the fourth ("Music").
 class ChangeTest : public ChangesTest, public testing::WithParamInterface<Cell> {
 public:
     static std::string nameOfCell(const testing::TestParamInfo<Cell>& cell) { return nameOf(cell.param.state); }
@@ -51,11 +52,13 @@ protected:
     /// Whether there is a list, on the top or beneath.
     bool hasList() const { return GetParam().state != State::Nothing; }
 
-    /// Goes back to the list, or, where there is none, opens a tip by request. Then the list has these rows, a tap on
-    /// one opens its tip, the way back leads to the list, and usage was recorded once a tip.
+    /// Opens a tip by request where there is one to open. Goes back to the list, or, where there is none, opens a tip
+    /// by request. Then the list has these rows, a tap on one opens its tip, the way back leads to the list, and usage
+    /// was recorded once a tip.
     void expectToWork(const Names& names, Language language);
     /// From a pager on the top. None of its views is gone too early.
     void expectTheWayBack();
+    void expectARequestToOpenItsTip(const Names& names, Language language);
     void expectTipsToOpen(const Names& names, Language language);
 
 private:

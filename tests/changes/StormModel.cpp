@@ -20,15 +20,27 @@ void StormModel::load(bool force) {
     }
 }
 
-std::vector<std::string> StormModel::requested(const std::string& appid, long page) const {
-    std::vector<std::string> records;
+StormModel::Names StormModel::allOpened(const std::string& appid, long page) const {
+    Names opened;
     for (const std::string& name : catalogue_) {
         if (tips::named(name).appid != appid)
             continue;
-        if (page > 1) {
+        if (page > 1)
             --page;
-            continue;
-        }
+        else
+            opened.push_back(name);
+    }
+    return opened;
+}
+
+std::string StormModel::opened(const std::string& appid, long page) const {
+    const Names all = allOpened(appid, page);
+    return all.empty() ? "" : all.back();
+}
+
+std::vector<std::string> StormModel::requested(const std::string& appid, long page) const {
+    std::vector<std::string> records;
+    for (const std::string& name : allOpened(appid, page)) {
         const auto title = read_.find(name);
         records.push_back("KT03 " + (title == read_.end() ? "" : title->second));
     }

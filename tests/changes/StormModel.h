@@ -27,11 +27,16 @@ public:
 
     /// The records that are due for a request.
     std::vector<std::string> requested(const std::string& appid, long page) const;
+    /// The tip that shows after a request: the last one that it opened; "" when it opened none.
+    std::string opened(const std::string& appid, long page) const;
+    /// Whether its texts were read since it came into the catalogue.
+    bool hasTexts(const std::string& name) const { return read_.count(name) > 0; }
     /// The record that is due for a row that was tapped; "" for a row without a tip.
     std::string chosen(int listIndex) const;
 
 private:
     bool isOffered(const tips::Tip& tip) const;
+    Names allOpened(const std::string& appid, long page) const;
 
     Names menuFile_ = tips::atFirst();
     std::string region_ = "Global";
