@@ -11,7 +11,7 @@
 /// when the display language, the theme or the installed packages change.
 class KestMainView : public app_assist::WView {
 public:
-    /// `pushOnTop` false slides the view in beneath the naviframe's top item.
+    /// `pushOnTop` false slides the view in beneath all others.
     explicit KestMainView(bool pushOnTop);
     ~KestMainView() override;
 
