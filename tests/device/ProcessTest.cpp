@@ -116,4 +116,17 @@ TEST(ProcessOfAnotherNamespace, IsNotEndedFromHere) {
                   "a process that cannot be seen from here, for example in a container, has to be ended there");
 }
 
+TEST(AProcess, CountsAsEndedWheneverItEndsWhileItIsLookedAt) {
+    // The kernel takes what is left of the children at once, also between the steps of the look.
+    const auto before = std::signal(SIGCHLD, SIG_IGN);
+    for (int i = 0; i < 300; ++i) {
+        const pid_t child = fork();
+        if (child == 0)
+            _exit(0);
+        while (Process(child).runs()) {
+        }
+    }
+    std::signal(SIGCHLD, before);
+}
+
 }  // namespace

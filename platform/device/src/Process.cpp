@@ -9,7 +9,6 @@
 #include <cstring>
 #include <fcntl.h>
 #include <fstream>
-#include <iterator>
 #include <spawn.h>
 #include <sys/wait.h>
 #include <thread>
@@ -92,7 +91,9 @@ public:
 
 bool Process::runs() const {
     std::ifstream stream(procFolder(id_) / "stat");
-    std::string stat{std::istreambuf_iterator<char>(stream), {}};
+    // Not by iterators, which throw where the process ends before it is read.
+    std::string stat;
+    std::getline(stream, stat, '\0');
     // The state follows the name, which stands in parentheses and may hold any character.
     const std::size_t name = stat.rfind(") ");
     return name != std::string::npos && stat[name + 2] != 'Z' && stat[name + 2] != 'X';
