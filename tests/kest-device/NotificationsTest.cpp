@@ -133,6 +133,17 @@ TEST_F(Notifications, ThatCarryNoRequestOpenNothing) {
     EXPECT_EQ(count(), 1U);
 }
 
+TEST_F(Notifications, WhoseRequestNobodyCanPassOnStay) {
+    device::Notification notification = tea();
+    notification.launchExtras = {{"cup=", "2"}};
+    post(notification);
+    EXPECT_EQ(run({"notifications", "open", "1", "--headless"}),
+              failed("notification 1 cannot be opened: the extra \"cup=\" has a \"=\" in its name"));
+    EXPECT_EQ(count(), 1U);
+    EXPECT_EQ(device_.application(), 0);
+    EXPECT_THAT(device_.json({"launches"}), IsEmpty());
+}
+
 TEST_F(Notifications, AreOpenedByTheirNumbersOnly) {
     EXPECT_EQ(run({"notifications", "open", "3"}), failed("there is no notification 3; the device has none"));
     for (int i = 0; i < 3; ++i)

@@ -3,6 +3,7 @@
 #include "Output.h"
 #include "Sender.h"
 #include "device/Error.h"
+#include "device/LaunchRequest.h"
 #include "notifier/NotificationAppearance.h"
 
 #include <iostream>
@@ -108,6 +109,9 @@ void open(Session& session, const Options& options) {
         throw device::Error("notification " + std::to_string(options.id) + " opens nothing: it has no launch request");
     }
     const LaunchRequest request{notification->launchAppId, notification->launchExtras, options.headless};
+    if (const std::string fault = device::faultOf({caller, request.appId, request.extras}); !fault.empty()) {
+        throw device::Error("notification " + std::to_string(options.id) + " cannot be opened: " + fault);
+    }
     const Launched launched = send(session, request, caller);
     device.presenter().takeDown(options.id);
     device.notifications().remove(options.id);
