@@ -71,4 +71,17 @@ TEST_F(BusRequest, IsWaitedForTenSecondsByAnApplicationThatTheBusHasStarted) {
                                             "by the bus; the end")));
 }
 
+TEST_F(BusRequest, IsNotCarriedOutWhereTheBusGoesBeforeItsTurn) {
+    RunningApp running(app_, {"page=1"});
+    test_ui::runFor(1.0);
+    app_.story.clear();
+    send("2");
+    send("3");
+    daemon_.kill();
+    test_ui::runFor(1.0);
+    EXPECT_THAT(app_.story, testing::IsEmpty());
+    EXPECT_FALSE(test_ui::hasEnded());
+    EXPECT_THAT(device_.logMessages(), Contains(testing::HasSubstr("the bus is gone: remote control is off")));
+}
+
 }  // namespace

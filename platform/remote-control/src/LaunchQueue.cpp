@@ -32,6 +32,10 @@ void LaunchQueue::launch(const Eldbus_Message* call, const std::vector<Server::E
     for (std::size_t i = 0; i < requests.size(); ++i) {
         const std::shared_ptr<Eldbus_Message> answered = i + 1 == requests.size() ? keep(call) : nullptr;
         add([this, answered, launch = launch_, extras = requests[i]] {
+            // The caller has no answer, so the request is still his.
+            if (!bus_.isAlive()) {
+                return;
+            }
             if (answered) {
                 eldbus_connection_send(bus_.connection(), eldbus_message_method_return_new(answered.get()), nullptr,
                                        nullptr, -1);
