@@ -150,6 +150,46 @@ TEST_F(ApplicationStart, WithAWordThatIsNoExtraEndsWithStatusTwoBeforeItTouchesA
     EXPECT_THAT(app_.story, IsEmpty());
 }
 
+TEST_F(ApplicationStart, TakesALinkIntoTheApplication) {
+    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}{?milk}\nmilk=[0-9]+")});
+    for (const char* link : {"tea:green?milk=1", "TEA:green?milk=1"}) {
+        RunningApp running(app_, {link});
+        EXPECT_EQ(std::nullopt, running.status());
+        app_.story.clear();
+        test_ui::runFor(1.0);
+        EXPECT_THAT(app_.story, ElementsAre("onAppControl com.example.app first cup=green milk=1", "onResume"));
+    }
+}
+
+TEST_F(ApplicationStart, WithALinkThatLeadsNowhereEndsWithStatusTwo) {
+    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}{?milk}\nmilk=[0-9]+")});
+    EXPECT_EQ(
+        "error: cannot open \"tea:green?milk=x\": its \"milk\" is \"x\", which does not match [0-9]+; such a link is "
+        "written tea:{cup}{?milk}\n",
+        begin({"tea:green?milk=x"}));
+    EXPECT_EQ(2, status_);
+    EXPECT_EQ("error: cannot open \"tea:\": its \"cup\" is empty; such a link is written tea:{cup}{?milk}\n",
+              begin({"tea:"}));
+    EXPECT_EQ(2, status_);
+    EXPECT_THAT(app_.story, IsEmpty());
+}
+
+TEST_F(ApplicationStart, TakesWhatIsNoLinkOfItsOwnAsExtras) {
+    const auto takes = [this](const std::vector<std::string>& words, const std::string& extras) {
+        RunningApp running(app_, words);
+        app_.story.clear();
+        test_ui::runFor(1.0);
+        EXPECT_THAT(app_.story, ElementsAre("onAppControl com.example.app first " + extras, "onResume"));
+    };
+    takes({"tea:green=1"}, "tea:green=1");
+    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}")});
+    takes({"coffee:black=1"}, "coffee:black=1");
+    takes({"cup=tea:green"}, "cup=tea:green");
+    takes({"tea:green=1", "milk=2"}, "milk=2 tea:green=1");
+    EXPECT_EQ("error: 'coffee:black' is no extra of a launch request: write KEY=VALUE\n", begin({"coffee:black"}));
+    EXPECT_EQ(2, status_);
+}
+
 TEST_F(ApplicationStart, ThatTheApplicationRefusesEndsWithStatusOne) {
     app_.creates = false;
     EXPECT_EQ("error: the application could not start\n", begin());

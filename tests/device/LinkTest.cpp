@@ -94,6 +94,48 @@ TEST(ALink, OfAnyLengthIsRefusedOnOneLine) {
                   "...\": it is longer than 64 KiB; such a link is written tea:{cup}{?sugar,milk}");
 }
 
+TEST(ALink, HasValuesOfTheirPatterns) {
+    const Link link(R"(tea:{cup}{?sugar,milk}
+sugar=[0-9]+
+cup=[a-z]+(\.[a-z]+)+)");
+    EXPECT_THAT(link.extrasOf("tea:green.leaf?sugar=10&milk=*"),
+                ElementsAre(Pair("cup", "green.leaf"), Pair("sugar", "10"), Pair("milk", "*")));
+    EXPECT_THAT(link.extrasOf("tea:green%2Eleaf?sugar=%31"),
+                ElementsAre(Pair("cup", "green.leaf"), Pair("sugar", "1")));
+    const std::string end = "; such a link is written tea:{cup}{?sugar,milk}";
+    EXPECT_EQ(messageOf([&] { link.extrasOf("tea:a.b?sugar=1a"); }),
+              "cannot open \"tea:a.b?sugar=1a\": its \"sugar\" is \"1a\", which does not match [0-9]+" + end);
+    EXPECT_EQ(messageOf([&] { link.extrasOf("tea:a.b?sugar=1%0A2"); }),
+              "cannot open \"tea:a.b?sugar=1%0A2\": its \"sugar\" is \"1 2\", which does not match [0-9]+" + end);
+    EXPECT_EQ(messageOf([&] { link.extrasOf("tea:!!!?sugar=1"); }),
+              "cannot open \"tea:!!!?sugar=1\": its \"cup\" is \"!!!\", which does not match [a-z]+(\\.[a-z]+)+" + end);
+}
+
+TEST(ALink, HasValuesOf255BytesWhereTheyMatchAPattern) {
+    const Link link("tea:{cup}{?milk}\ncup=(x|y)*");
+    const std::string longest(255, 'x');
+    EXPECT_THAT(link.extrasOf("tea:" + longest + "?milk=1" + longest),
+                ElementsAre(Pair("cup", longest), Pair("milk", "1" + longest)));
+    EXPECT_EQ(messageOf([&] { link.extrasOf("tea:x" + longest); }),
+              "cannot open \"tea:" + std::string(196, 'x') +
+                  "...\": its \"cup\" is longer than 255 bytes; such a link is written tea:{cup}{?milk}");
+}
+
+TEST(AFormOfLinks, HasPatternsThatAreSome) {
+    for (const std::string& pattern :
+         {std::string("["), std::string("(a"), std::string("*"), std::string(), std::string(1001, 'a')})
+        EXPECT_EQ(refusalOfForm("tea:{cup}\ncup=" + pattern),
+                  "the pattern for \"cup\" in links, \"" + pattern.substr(0, 200) +
+                      (pattern.size() > 200 ? "..." : "") + "\", is no regular expression of up to 1000 characters");
+    EXPECT_EQ(refusalOfForm("tea:{cup}{?milk}\nlemon=a"),
+              "there is a pattern for \"lemon\", a name that the links tea:{cup}{?milk} do not have");
+    EXPECT_EQ(refusalOfForm("tea:{cup}\ncup=a\ncup=b"),
+              "there is a second pattern for \"cup\" in links; a name has one");
+    EXPECT_EQ(refusalOfForm("tea:{cup}\ncup"), "\"cup\" is no pattern of a name in links; write NAME=PATTERN");
+    EXPECT_EQ(refusalOfForm("tea\ncup=a"),
+              "\"tea\" is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
+}
+
 TEST(AFormOfLinks, HasASchemeAndNames) {
     EXPECT_EQ(Link("tea:{cup}").form(), "tea:{cup}");
     EXPECT_THAT(Link("x+y-1.0:{a_1}{?b}").extrasOf("X+Y-1.0:c?b=d"), ElementsAre(Pair("a_1", "c"), Pair("b", "d")));
@@ -140,6 +182,36 @@ TEST_F(LinkInManifest, IsRefusedWhereItIsNone) {
               ":3: \"\" is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
     EXPECT_EQ(faultOf("<metadata key=\"link\" value=\"tea:{cup}\"/>\n<metadata key=\"link\" value=\"tea:{cup}\"/>"),
               ":4: there is a second form of links; an application has one");
+}
+
+TEST_F(LinkInManifest, HasPatternsInAnyOrder) {
+    const auto package = packageWith("<metadata key=\"link.milk\" value=\"[0-9]+\"/>"
+                                     "<metadata key=\"link\" value=\"tea:{cup}{?milk}\"/>"
+                                     "<metadata key=\"link.cup\" value=\"a=[a-z]&lt;\"/>");
+    ASSERT_TRUE(package.link.has_value());
+    EXPECT_THAT(package.link->extrasOf("tea:a=b%3C?milk=1"), ElementsAre(Pair("cup", "a=b<"), Pair("milk", "1")));
+    EXPECT_EQ(messageOf([&] { package.link->extrasOf("tea:a=b%3C?milk=x"); }),
+              "cannot open \"tea:a=b%3C?milk=x\": its \"milk\" is \"x\", which does not match [0-9]+; such a link is "
+              "written tea:{cup}{?milk}");
+    EXPECT_NE(messageOf([&] { package.link->extrasOf("tea:a?milk=1"); }), "");
+}
+
+TEST_F(LinkInManifest, IsRefusedForAPatternThatIsNone) {
+    const auto faultOfPattern = [this](const std::string& attributes) {
+        return faultOf("<metadata key=\"link\" value=\"tea:{cup}\"/>\n<metadata " + attributes + "/>");
+    };
+    const std::string end = ", is no regular expression of up to 1000 characters";
+    EXPECT_EQ(faultOfPattern(R"(key="link.cup" value="[")"), ":4: the pattern for \"cup\" in links, \"[\"" + end);
+    EXPECT_EQ(faultOfPattern(R"(key="link.cup")"), ":4: the pattern for \"cup\" in links, \"\"" + end);
+    for (const std::string name : {"lemon", ""})
+        EXPECT_EQ(faultOfPattern("key=\"link." + name + "\" value=\"a\""),
+                  ":4: there is a pattern for \"" + name + "\", a name that the links tea:{cup} do not have");
+    EXPECT_EQ(faultOfPattern(R"(key="link.cup=a" value="a")"),
+              ":4: there is a pattern for \"cup=a\", which is no name in a link");
+    EXPECT_EQ(faultOfPattern(R"(key="link.cup" value="a"/><metadata key="link.cup" value="b")"),
+              ":4: there is a second pattern for \"cup\" in links; a name has one");
+    EXPECT_EQ(faultOf("<metadata key=\"link.cup\" value=\"a\"/>"),
+              ":3: there is a pattern for \"cup\", but no form of links");
 }
 
 }  // namespace

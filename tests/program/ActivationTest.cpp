@@ -82,6 +82,19 @@ TEST_F(StartedByTheBus, RefusesAnotherLinkAndShowsNothing) {
     EXPECT_THAT(records(), IsEmpty());
 }
 
+TEST_F(StartedByTheBus, RefusesALinkWithWhatIsNoApplicationOrNoNumberOfATip) {
+    EXPECT_EQ(
+        ask(desktopInterface, "Open", {BusClient::list({"kest:com.ravella.clock?page=abc"}), noData_}),
+        "com.ravella.device.Error.Failed: cannot open \"kest:com.ravella.clock?page=abc\": its \"page\" is \"abc\", "
+        "which does not match [0-9]+; such a link is written kest:{appID}{?page}");
+    EXPECT_EQ(
+        ask(desktopInterface, "Open", {BusClient::list({"kest:!!!?page=1"}), noData_}),
+        "com.ravella.device.Error.Failed: cannot open \"kest:!!!?page=1\": its \"appID\" is \"!!!\", which does not "
+        "match [A-Za-z][A-Za-z0-9_-]*(\\.[A-Za-z0-9_-]+)+; such a link is written kest:{appID}{?page}");
+    EXPECT_THAT(views(), IsEmpty());
+    EXPECT_THAT(records(), IsEmpty());
+}
+
 TEST_F(StartedByTheBus, IsOneHoweverManyAskAtATime) {
     std::vector<std::thread> others;
     for (int i = 0; i < 5; ++i)

@@ -54,6 +54,23 @@ TEST_F(SecondStart, HandsItsRequestOver) {
     EXPECT_THAT(records(), ElementsAre(recordOf(1)));
 }
 
+TEST_F(SecondStart, HandsTheRequestOfALinkOver) {
+    EXPECT_EQ(startAgain({"kest:com.ravella.clock?page=1"}), running());
+    device_.must({"wait-for", "view=KestContentView"});
+    expectTipAboveTheList(1);
+}
+
+TEST_F(SecondStart, WithALinkThatLeadsToNoTipIsRefused) {
+    EXPECT_EQ(
+        startAgain({"kest:com.ravella.clock?page=abc"}),
+        (Result{2,
+                "kest: error: cannot open \"kest:com.ravella.clock?page=abc\": its \"page\" is \"abc\", which does "
+                "not match [0-9]+; such a link is written kest:{appID}{?page}\n",
+                ""}));
+    EXPECT_THAT(views(), ElementsAre("KestMainView"));
+    EXPECT_THAT(records(), IsEmpty());
+}
+
 TEST_F(SecondStart, TakesThePlaceOfTheFirstWhereThatEndsBeforeItsTurn) {
     const pid_t first = device_.application();
     kill(first, SIGSTOP);

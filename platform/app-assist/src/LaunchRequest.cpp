@@ -1,9 +1,13 @@
 #include "LaunchRequest.h"
 
+#include <device/Error.h>
 #include <device/OneLine.h>
 
 #include <stdexcept>
 #include <string_view>
+#include <utility>
+
+#include <strings.h>
 
 namespace app_assist {
 
@@ -12,9 +16,47 @@ namespace {
 constexpr std::string_view activation = "--dbus-activated";
 constexpr std::size_t longestShown = 200;
 
+bool hasScheme(const std::string& word) {
+    const auto colon = word.find(':');
+    return colon != std::string::npos && colon < word.find('=');
+}
+
+bool hasSchemeOf(const device::Link& link, const std::string& word) {
+    const auto length = link.form().find(':') + 1;
+    return strncasecmp(word.c_str(), link.form().c_str(), length) == 0;
+}
+
+/// What the application's link stands for; nullopt for a word that is none.
+std::optional<device::Extras> extrasOfLink(const std::string& word, const LaunchRequest::LinkOfApplication& link) {
+    // Other words are for any application, and are refused before it is known which one this is.
+    if (!hasScheme(word))
+        return std::nullopt;
+    const std::optional<device::Link> form = link();
+    if (!form || !hasSchemeOf(*form, word))
+        return std::nullopt;
+    try {
+        return form->extrasOf(word);
+    } catch (const device::Error& fault) {
+        throw std::invalid_argument(fault.what());
+    }
+}
+
+device::Extras extrasOfWords(int argc, const char* const* argv) {
+    device::Extras extras;
+    for (int i = 1; i < argc; ++i) {
+        const std::string word = argv[i];
+        const auto equals = word.find('=');
+        if (equals == std::string::npos || equals == 0)
+            throw std::invalid_argument("'" + device::oneLine(word, longestShown) +
+                                        "' is no extra of a launch request: write KEY=VALUE");
+        extras.emplace_back(word.substr(0, equals), word.substr(equals + 1));
+    }
+    return extras;
+}
+
 }  // namespace
 
-LaunchRequest::Words LaunchRequest::parse(int argc, const char* const* argv) {
+LaunchRequest::Words LaunchRequest::parse(int argc, const char* const* argv, const LinkOfApplication& link) {
     if (argc > 1 && argv[1] == activation) {
         if (argc > 2)
             throw std::invalid_argument(std::string(activation) +
@@ -22,14 +64,10 @@ LaunchRequest::Words LaunchRequest::parse(int argc, const char* const* argv) {
         return {{}, true};
     }
     device::LaunchRequest request;
-    for (int i = 1; i < argc; ++i) {
-        const std::string word = argv[i];
-        const auto equals = word.find('=');
-        if (equals == std::string::npos || equals == 0)
-            throw std::invalid_argument("'" + device::oneLine(word, longestShown) +
-                                        "' is no extra of a launch request: write KEY=VALUE");
-        request.extras.emplace_back(word.substr(0, equals), word.substr(equals + 1));
-    }
+    if (auto extras = argc == 2 ? extrasOfLink(argv[1], link) : std::nullopt)
+        request.extras = *std::move(extras);
+    else
+        request.extras = extrasOfWords(argc, argv);
     if (const std::string fault = device::faultOf(request); !fault.empty())
         throw std::invalid_argument(fault);
     return {std::move(request.extras), false};

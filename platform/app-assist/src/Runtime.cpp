@@ -57,10 +57,13 @@ Runtime::~Runtime() {
 
 std::optional<int> Runtime::begin(int argc, char** argv) {
     try {
-        words_ = LaunchRequest::parse(argc, argv);
+        words_ = LaunchRequest::parse(argc, argv, [] { return device::Device::current().application().link; });
     } catch (const std::invalid_argument& error) {
         device::sayErrorOnce(error.what());
         return 2;
+    } catch (const std::exception& error) {
+        device::sayErrorOnce(error.what());
+        return 1;
     }
     try {
         if (const auto status = claimInstance())

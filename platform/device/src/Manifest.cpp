@@ -12,6 +12,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 #include <utility>
+#include <vector>
 
 namespace device {
 namespace {
@@ -140,10 +141,32 @@ std::string pathBelow(const std::filesystem::path& folder, const std::string& na
     return (folder / relative).string();
 }
 
-/// How links lead into the application: <metadata key="link" value="SCHEME:{NAME}{?NAME,NAME}"/>.
+constexpr std::string_view patternKey = "link.";
+
+void readLinkPattern(Package& package, xmlNode* metadata, const std::filesystem::path& file) {
+    const std::string name = attributeOf(metadata, "key").substr(patternKey.size());
+    if (!package.link)
+        fail(file, xmlGetLineNo(metadata), "there is a pattern for \"" + name + "\", but no form of links");
+    if (name.find('=') != std::string::npos)
+        fail(file, xmlGetLineNo(metadata), "there is a pattern for \"" + name + "\", which is no name in a link");
+    try {
+        package.link = Link(package.link->form() + '\n' + name + '=' + attributeOf(metadata, "value"));
+    } catch (const Error& fault) {
+        fail(file, xmlGetLineNo(metadata), fault.what());
+    }
+}
+
+/// How links lead into the application: <metadata key="link" value="SCHEME:{NAME}{?NAME,NAME}"/>, and of what pattern
+/// the values of a name are: <metadata key="link.NAME" value="PATTERN"/>.
 void readLink(Package& package, xmlNode* application, const std::filesystem::path& file) {
+    std::vector<xmlNode*> patterns;
     for (xmlNode* child = application->children; child; child = child->next) {
-        if (nameOf(child) != "metadata" || attributeOf(child, "key") != "link")
+        if (nameOf(child) != "metadata")
+            continue;
+        const std::string key = attributeOf(child, "key");
+        if (key.starts_with(patternKey))
+            patterns.push_back(child);
+        if (key != "link")
             continue;
         if (package.link)
             fail(file, xmlGetLineNo(child), "there is a second form of links; an application has one");
@@ -153,6 +176,8 @@ void readLink(Package& package, xmlNode* application, const std::filesystem::pat
             fail(file, xmlGetLineNo(child), fault.what());
         }
     }
+    for (xmlNode* pattern : patterns)
+        readLinkPattern(package, pattern, file);
 }
 
 void readApplication(Package& package, xmlNode* application, const std::filesystem::path& file) {

@@ -9,9 +9,11 @@ namespace device {
 
 /// The links that lead into an application, and what each asks of it. Their form is a URI template as of RFC 6570, of
 /// which it may have SCHEME:{NAME}, and behind that {?NAME,NAME...}. The names are those of the extras.
+/// Behind the template a line NAME=PATTERN for each of some names: their values have at most 255 bytes and match it, an
+/// ECMAScript regular expression.
 class Link {
 public:
-    /// Throws Error, one line, when the text is no such template.
+    /// Throws Error, one line, when the text is no such form.
     explicit Link(const std::string& form);
 
     const std::string& form() const { return form_; }
