@@ -175,6 +175,8 @@ TEST_F(StartByTheBus, HasTheFirstRequestFromTheBus) {
 
 TEST_F(StartByTheBus, LeavesTheRequestToTheOneThatRunsAlready) {
     auto first = start();
+    const auto on = device::Bus::connect(device::Folder(folder()));
+    ASSERT_TRUE(on && isUp(*on, second)) << first->said();
     auto again = start(second, {"--dbus-activated"});
     EXPECT_EQ(0, again->wait());
     EXPECT_EQ("second-app: com.example.second is running already\n", again->said());
