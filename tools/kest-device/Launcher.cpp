@@ -30,6 +30,16 @@ void requireGoodEnd(Session& session, const std::string& appId, const std::strin
     }
 }
 
+/// How the child ended, as soon as that can be told: its other threads may end after the one that it began with.
+std::optional<std::string> endWithin(const device::Process& process, std::chrono::milliseconds time) {
+    const auto deadline = std::chrono::steady_clock::now() + time;
+    std::optional<std::string> how;
+    while (!(how = device::endOfChild(process)) && std::chrono::steady_clock::now() < deadline) {
+        std::this_thread::sleep_for(10ms);
+    }
+    return how;
+}
+
 /// False when the application has ended well before.
 bool reachesFirstScreen(Session& session, const LaunchRequest& request, const device::Process& process) {
     const auto deadline = std::chrono::steady_clock::now() + patience;
@@ -49,8 +59,8 @@ bool reachesFirstScreen(Session& session, const LaunchRequest& request, const de
     try {
         callTo(session, request.appId).call("Settle");
     } catch (const device::Error&) {
-        if (process.endsWithin(1s)) {
-            requireGoodEnd(session, request.appId, device::endOfChild(process).value_or("by itself"));
+        if (const std::optional<std::string> how = endWithin(process, 1s)) {
+            requireGoodEnd(session, request.appId, *how);
             return false;
         }
         process.end();
