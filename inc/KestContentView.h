@@ -14,7 +14,7 @@ class KestContentSubView;
 /// pages are there from the start; the chosen one is filled first, the others a moment later.
 class KestContentView : public app_assist::WPageSlideView {
 public:
-    /// `listIndex` is the genlist index of the chosen row: 2 for the first menu.
+    /// `listIndex` is the genlist index of the chosen row, from firstListIndex on.
     /// `pushOnTop` false makes the view the top item without a transition.
     KestContentView(int listIndex, bool pushOnTop);
     ~KestContentView() override;
@@ -24,6 +24,8 @@ public:
     /// False when the catalogue has other menus by now than the pager was made for.
     bool isOfCatalogue() const;
 
+    /// The genlist index of the first menu: the list's indices count from 1, and row 1 is the title row.
+    static const int firstListIndex = 2;
     /// A catalogue has no more menus than this.
     static const std::int32_t mostPages = 15;
 

@@ -24,9 +24,6 @@ namespace {
 /// The scale that the screens were drawn for.
 const double baseScale = 2.6;
 
-/// The list's indices count from 1, and row 1 is the title row.
-const int firstMenuIndex = 2;
-
 void allowPortraitOnly(Evas_Object* window) {
     if (!elm_win_wm_rotation_supported_get(window)) {
         return;
@@ -166,7 +163,7 @@ bool KestApp::__openMenu(int menu, bool firstLaunch) {
         KEST_ERR("WNaviframe is NULL");
         return false;
     }
-    const int listIndex = menu + firstMenuIndex;
+    const int listIndex = menu + KestContentView::firstListIndex;
     if (firstLaunch) {
         __replaceMainView(new KestMainView(false));
         naviframe->push(new KestContentView(listIndex, true), nullptr, nullptr);
@@ -193,7 +190,7 @@ void KestApp::__turnPager(app_assist::WNaviframe& naviframe, KestContentView& pa
         return;
     }
     // Its pages stand for menus that have moved meanwhile.
-    naviframe.push(new KestContentView(menu + firstMenuIndex, false), nullptr, nullptr);
+    naviframe.push(new KestContentView(menu + KestContentView::firstListIndex, false), nullptr, nullptr);
     if (!naviframe.isTopView(&pager)) {
         elm_object_item_del(pager.getNaviItem());
     }

@@ -16,9 +16,6 @@ using app_assist::KestContentSubView;
 
 namespace {
 
-/// The list's indices count from 1, and row 1 is the title row.
-const int firstMenuIndex = 2;
-
 /// The other pages are filled when the chosen one has come to rest.
 const double secondsToOtherPages = 0.4;
 
@@ -36,9 +33,10 @@ std::vector<std::string> keysOfCatalogue() {
 }  // namespace
 
 const std::int32_t KestContentView::mostPages;
+const int KestContentView::firstListIndex;
 
 KestContentView::KestContentView(int listIndex, bool onTop)
-    : __selectedView(listIndex - firstMenuIndex), pages(), pageCount(0), pushOnTop(onTop), menuKeys(keysOfCatalogue()),
+    : __selectedView(listIndex - firstListIndex), pages(), pageCount(0), pushOnTop(onTop), menuKeys(keysOfCatalogue()),
       appended(0), displayed(noMenu), going(false) {
     KEST_BEGIN();
     KEST_INFO("__selectedView:%d", __selectedView);
@@ -83,11 +81,11 @@ Elm_Object_Item* KestContentView::onPushToNaviframe(Evas_Object* naviframe) {
     WASSERT(getEvasObj() != nullptr);
     elm_object_item_part_content_unset(getNaviItem(), "title_left_btn");
     Evas_Object* back = KestCommon::createButton(naviframe, "naviframe/back_btn/default", nullptr, __backCb, this);
-    if (pushOnTop || !elm_naviframe_top_item_get(naviframe)) {
+    Elm_Object_Item* top = elm_naviframe_top_item_get(naviframe);
+    if (pushOnTop || !top) {
         return elm_naviframe_item_push(naviframe, nullptr, back, nullptr, getEvasObj(), nullptr);
     }
-    return elm_naviframe_item_insert_after(naviframe, elm_naviframe_top_item_get(naviframe), nullptr, back, nullptr,
-                                           getEvasObj(), nullptr);
+    return elm_naviframe_item_insert_after(naviframe, top, nullptr, back, nullptr, getEvasObj(), nullptr);
 }
 
 void KestContentView::onPushed(Elm_Object_Item* naviItem) {

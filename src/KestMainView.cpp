@@ -15,13 +15,6 @@
 #include <cstring>
 #include <exception>
 
-namespace {
-
-/// The list's indices count from 1, and row 1 is the title row.
-const int firstMenuIndex = 2;
-
-}  // namespace
-
 /// What a menu row knows of itself; the list frees it with the row.
 struct KestMainView::RowData {
     Elm_Object_Item* item;
@@ -213,7 +206,8 @@ void KestMainView::__selectItemCb(void* data, Evas_Object*, void* event_info) tr
     const int index = elm_genlist_item_index_get(item);
     KEST_INFO("selected index:%d", index);
 
-    const KestContentInfo* record = view->__recordAt(static_cast<unsigned int>(index - firstMenuIndex));
+    const KestContentInfo* record =
+        view->__recordAt(static_cast<unsigned int>(index - KestContentView::firstListIndex));
     if (!record) {
         KEST_ERR("no record for index:%d", index);
         return;

@@ -134,6 +134,12 @@ protected:
             said.erase(at, program.size());
         return said;
     }
+    /// Makes the application one that links lead into.
+    void takeLinks() {
+        device::Link link("tea:{cup}{?milk}");
+        link.restrict("milk", "[0-9]+");
+        device_->setApplication({device_.appId(), device_.appRoot(), link});
+    }
     std::optional<int> status_;
 };
 
@@ -151,7 +157,7 @@ TEST_F(ApplicationStart, WithAWordThatIsNoExtraEndsWithStatusTwoBeforeItTouchesA
 }
 
 TEST_F(ApplicationStart, TakesALinkIntoTheApplication) {
-    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}{?milk}\nmilk=[0-9]+")});
+    takeLinks();
     for (const char* link : {"tea:green?milk=1", "TEA:green?milk=1"}) {
         RunningApp running(app_, {link});
         EXPECT_EQ(std::nullopt, running.status());
@@ -162,7 +168,7 @@ TEST_F(ApplicationStart, TakesALinkIntoTheApplication) {
 }
 
 TEST_F(ApplicationStart, WithALinkThatLeadsNowhereEndsWithStatusTwo) {
-    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}{?milk}\nmilk=[0-9]+")});
+    takeLinks();
     EXPECT_EQ(
         "error: cannot open \"tea:green?milk=x\": its \"milk\" is \"x\", which does not match [0-9]+; such a link is "
         "written tea:{cup}{?milk}\n",

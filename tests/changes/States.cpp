@@ -33,35 +33,43 @@ std::string nameOf(State state) {
 }
 
 std::vector<Cell> ChangeTest::cellsWhereNothingMoves() {
+    return cellsWhereThePagerCounts("list Tips: Steps", "12", "Music");
+}
+
+std::vector<Cell> ChangeTest::cellsWhereThePagerCloses() {
+    const std::string list = "list Tips: Tips and guidelines";
+    return cellsWhereThePagerCloses(list, list, "page Tips 2/12: Alarm, How to use Alarm");
+}
+
+std::vector<Cell> ChangeTest::cellsWhereThePagerCloses(const std::string& list, const std::string& scrolledList,
+                                                       const std::string& pageBeneath) {
+    return {
+        {State::List, list},           {State::ScrolledList, scrolledList},
+        {State::PagerComes, list},     {State::PagerAtRest, list},
+        {State::PicturesPlay, list},   {State::FingerSwipes, list},
+        {State::PagesGlide, list},     {State::RequestedPagerComes, list},
+        {State::RequestedPager, list}, {State::RequestedPagers, pageBeneath},
+        {State::TurnedPager, list},    {State::Nothing, "nothing"},
+    };
+}
+
+std::vector<Cell> ChangeTest::cellsWhereThePagerCounts(const std::string& scrolledList, const std::string& count,
+                                                       const std::string& fourthTitle) {
+    const std::string second = "page Tips 2/" + count + ": Alarm, How to use Alarm";
+    const std::string third = "page Tips 3/" + count + ": Snooze, How to use Snooze";
+    const std::string fourth = "page Tips 4/" + count + ": " + fourthTitle + ", How to use Music";
     return {
         {State::List, "list Tips: Tips and guidelines"},
-        {State::ScrolledList, "list Tips: Steps"},
-        {State::PagerComes, "page Tips 2/12: Alarm, How to use Alarm"},
-        {State::PagerAtRest, "page Tips 3/12: Snooze, How to use Snooze"},
-        {State::PicturesPlay, "page Tips 2/12: Alarm, How to use Alarm"},
-        {State::FingerSwipes, "page Tips 4/12: Music, How to use Music"},
-        {State::PagesGlide, "page Tips 4/12: Music, How to use Music"},
+        {State::ScrolledList, scrolledList},
+        {State::PagerComes, second},
+        {State::PagerAtRest, third},
+        {State::PicturesPlay, second},
+        {State::FingerSwipes, fourth},
+        {State::PagesGlide, fourth},
         {State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
         {State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
         {State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
         {State::TurnedPager, "page Tips 4/12: Music, How to use Music"},
-        {State::Nothing, "nothing"},
-    };
-}
-
-std::vector<Cell> ChangeTest::cellsWhereThePagerCloses() {
-    return {
-        {State::List, "list Tips: Tips and guidelines"},
-        {State::ScrolledList, "list Tips: Tips and guidelines"},
-        {State::PagerComes, "list Tips: Tips and guidelines"},
-        {State::PagerAtRest, "list Tips: Tips and guidelines"},
-        {State::PicturesPlay, "list Tips: Tips and guidelines"},
-        {State::FingerSwipes, "list Tips: Tips and guidelines"},
-        {State::PagesGlide, "list Tips: Tips and guidelines"},
-        {State::RequestedPagerComes, "list Tips: Tips and guidelines"},
-        {State::RequestedPager, "list Tips: Tips and guidelines"},
-        {State::RequestedPagers, "page Tips 2/12: Alarm, How to use Alarm"},
-        {State::TurnedPager, "list Tips: Tips and guidelines"},
         {State::Nothing, "nothing"},
     };
 }
@@ -137,6 +145,13 @@ void ChangeTest::comeToRest() {
         screen().lift();
     fingerIsDown_ = false;
     test_ui::runFor(1);
+}
+
+void ChangeTest::expectWhatTheCellSays(const Names& names, Language language) {
+    comeToRest();
+    EXPECT_EQ(top(), GetParam().top);
+    expectToWork(names, language);
+    EXPECT_THAT(newErrors(), IsEmpty());
 }
 
 void ChangeTest::expectToWork(const Names& names, Language language) {

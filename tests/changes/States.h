@@ -43,6 +43,12 @@ public:
     static std::vector<Cell> cellsWhereNothingMoves();
     /// One pager goes, and the list is built anew, from its top.
     static std::vector<Cell> cellsWhereThePagerCloses();
+    /// One pager goes, and the list says these; the page beneath, where there is one, says that.
+    static std::vector<Cell> cellsWhereThePagerCloses(const std::string& list, const std::string& scrolledList,
+                                                      const std::string& pageBeneath);
+    /// A pager stays open over the list, with these pages in view; requested ones do not hear how many there are now.
+    static std::vector<Cell> cellsWhereThePagerCounts(const std::string& scrolledList, const std::string& count,
+                                                      const std::string& fourthTitle);
 
 protected:
     /// Brings the application into the state of the cell, and forgets what led there.
@@ -52,6 +58,8 @@ protected:
     /// Whether there is a list, on the top or beneath.
     bool hasList() const { return GetParam().state != State::Nothing; }
 
+    /// Right after a change: what the table says shows, everything works, and nothing was an error.
+    void expectWhatTheCellSays(const Names& names, Language language);
     /// Opens a tip by request where there is one to open. Goes back to the list, or, where there is none, opens a tip
     /// by request. Then the list has these rows, a tap on one opens its tip, the way back leads to the list, and usage
     /// was recorded once a tip.

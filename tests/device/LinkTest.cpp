@@ -34,6 +34,11 @@ std::string refusalOfForm(const std::string& text) {
     return messageOf([&] { Link link(text); });
 }
 
+/// What is said of a pattern for the links tea:{cup}{?milk}.
+std::string refusalOfPattern(const std::string& name, const std::string& pattern) {
+    return messageOf([&] { Link("tea:{cup}{?milk}").restrict(name, pattern); });
+}
+
 TEST(ALink, GivesTheExtrasThatItNames) {
     EXPECT_THAT(open("tea:green"), ElementsAre(Pair("cup", "green")));
     EXPECT_THAT(open("tea:green?milk=1&sugar=two"),
@@ -95,9 +100,9 @@ TEST(ALink, OfAnyLengthIsRefusedOnOneLine) {
 }
 
 TEST(ALink, HasValuesOfTheirPatterns) {
-    const Link link(R"(tea:{cup}{?sugar,milk}
-sugar=[0-9]+
-cup=[a-z]+(\.[a-z]+)+)");
+    Link link("tea:{cup}{?sugar,milk}");
+    link.restrict("sugar", "[0-9]+");
+    link.restrict("cup", R"([a-z]+(\.[a-z]+)+)");
     EXPECT_THAT(link.extrasOf("tea:green.leaf?sugar=10&milk=*"),
                 ElementsAre(Pair("cup", "green.leaf"), Pair("sugar", "10"), Pair("milk", "*")));
     EXPECT_THAT(link.extrasOf("tea:green%2Eleaf?sugar=%31"),
@@ -112,7 +117,8 @@ cup=[a-z]+(\.[a-z]+)+)");
 }
 
 TEST(ALink, HasValuesOf255BytesWhereTheyMatchAPattern) {
-    const Link link("tea:{cup}{?milk}\ncup=(x|y)*");
+    Link link("tea:{cup}{?milk}");
+    link.restrict("cup", "(x|y)*");
     const std::string longest(255, 'x');
     EXPECT_THAT(link.extrasOf("tea:" + longest + "?milk=1" + longest),
                 ElementsAre(Pair("cup", longest), Pair("milk", "1" + longest)));
@@ -124,16 +130,17 @@ TEST(ALink, HasValuesOf255BytesWhereTheyMatchAPattern) {
 TEST(AFormOfLinks, HasPatternsThatAreSome) {
     for (const std::string& pattern :
          {std::string("["), std::string("(a"), std::string("*"), std::string(), std::string(1001, 'a')})
-        EXPECT_EQ(refusalOfForm("tea:{cup}\ncup=" + pattern),
-                  "the pattern for \"cup\" in links, \"" + pattern.substr(0, 200) +
-                      (pattern.size() > 200 ? "..." : "") + "\", is no regular expression of up to 1000 characters");
-    EXPECT_EQ(refusalOfForm("tea:{cup}{?milk}\nlemon=a"),
+        EXPECT_EQ(refusalOfPattern("cup", pattern), "the pattern for \"cup\" in links, \"" + pattern.substr(0, 200) +
+                                                        (pattern.size() > 200 ? "..." : "") +
+                                                        "\", is no regular expression of up to 1000 characters");
+    EXPECT_EQ(refusalOfPattern("lemon", "a"),
               "there is a pattern for \"lemon\", a name that the links tea:{cup}{?milk} do not have");
-    EXPECT_EQ(refusalOfForm("tea:{cup}\ncup=a\ncup=b"),
+    Link link("tea:{cup}");
+    link.restrict("cup", "a");
+    EXPECT_EQ(messageOf([&] { link.restrict("cup", "b"); }),
               "there is a second pattern for \"cup\" in links; a name has one");
-    EXPECT_EQ(refusalOfForm("tea:{cup}\ncup"), "\"cup\" is no pattern of a name in links; write NAME=PATTERN");
-    EXPECT_EQ(refusalOfForm("tea\ncup=a"),
-              "\"tea\" is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
+    EXPECT_EQ(refusalOfForm("tea:{cup}\ncup=a"),
+              "\"tea:{cup} cup=a\" is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
 }
 
 TEST(AFormOfLinks, HasASchemeAndNames) {
@@ -207,7 +214,7 @@ TEST_F(LinkInManifest, IsRefusedForAPatternThatIsNone) {
         EXPECT_EQ(faultOfPattern("key=\"link." + name + "\" value=\"a\""),
                   ":4: there is a pattern for \"" + name + "\", a name that the links tea:{cup} do not have");
     EXPECT_EQ(faultOfPattern(R"(key="link.cup=a" value="a")"),
-              ":4: there is a pattern for \"cup=a\", which is no name in a link");
+              ":4: there is a pattern for \"cup=a\", a name that the links tea:{cup} do not have");
     EXPECT_EQ(faultOfPattern(R"(key="link.cup" value="a"/><metadata key="link.cup" value="b")"),
               ":4: there is a second pattern for \"cup\" in links; a name has one");
     EXPECT_EQ(faultOf("<metadata key=\"link.cup\" value=\"a\"/>"),

@@ -14,6 +14,9 @@ namespace {
 using namespace std::chrono_literals;
 using device::LaunchOutcome;
 
+/// Who asks, in the device's record of launches.
+constexpr char caller[] = "kest-device";
+
 /// As much as anything can show: the application in front tells.
 bool drawsIntoMemory(Session& session, const std::vector<RunningApplication>& running) {
     return !running.empty() && inFront(session, running).process.variable("ELM_ENGINE") == "buffer";
@@ -59,7 +62,7 @@ Launched carryOut(Session& session, const LaunchRequest& request) {
 
 }  // namespace
 
-Launched send(Session& session, const LaunchRequest& request, const std::string& caller) {
+Launched send(Session& session, const LaunchRequest& request) {
     device::Launches& launches = session.device().launches();
     const long long record = launches.append({caller, request.appId, request.extras}, LaunchOutcome::Asked);
     try {

@@ -4,7 +4,6 @@
 #include "device/Launches.h"
 
 #include <optional>
-#include <string>
 
 namespace tool {
 
@@ -16,8 +15,8 @@ struct Launched {
 };
 
 /// Gives the request to the application that runs, or starts it with it, headless also where the application in front
-/// is; returns when the screen has settled. The device remembers the launch, with who asked for it.
+/// is; returns when the screen has settled. The device remembers the launch as this tool's.
 /// Throws device::Error when the application cannot be started or does not take the request.
-Launched send(Session& session, const LaunchRequest& request, const std::string& caller);
+Launched send(Session& session, const LaunchRequest& request);
 
 }  // namespace tool

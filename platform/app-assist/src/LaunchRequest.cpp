@@ -7,23 +7,15 @@
 #include <string_view>
 #include <utility>
 
-#include <strings.h>
-
 namespace app_assist {
 
 namespace {
 
 constexpr std::string_view activation = "--dbus-activated";
-constexpr std::size_t longestShown = 200;
 
 bool hasScheme(const std::string& word) {
     const auto colon = word.find(':');
     return colon != std::string::npos && colon < word.find('=');
-}
-
-bool hasSchemeOf(const device::Link& link, const std::string& word) {
-    const auto length = link.form().find(':') + 1;
-    return strncasecmp(word.c_str(), link.form().c_str(), length) == 0;
 }
 
 /// What the application's link stands for; nullopt for a word that is none.
@@ -32,7 +24,7 @@ std::optional<device::Extras> extrasOfLink(const std::string& word, const Launch
     if (!hasScheme(word))
         return std::nullopt;
     const std::optional<device::Link> form = link();
-    if (!form || !hasSchemeOf(*form, word))
+    if (!form || !form->isSchemeOf(word))
         return std::nullopt;
     try {
         return form->extrasOf(word);
@@ -47,7 +39,7 @@ device::Extras extrasOfWords(int argc, const char* const* argv) {
         const std::string word = argv[i];
         const auto equals = word.find('=');
         if (equals == std::string::npos || equals == 0)
-            throw std::invalid_argument("'" + device::oneLine(word, longestShown) +
+            throw std::invalid_argument("'" + device::oneLine(word) +
                                         "' is no extra of a launch request: write KEY=VALUE");
         extras.emplace_back(word.substr(0, equals), word.substr(equals + 1));
     }

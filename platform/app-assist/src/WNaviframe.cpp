@@ -36,8 +36,8 @@ WNaviframe::WNaviframe() = default;
 
 WNaviframe::~WNaviframe() {
     WNaviframe::destroy();
-    if (emptyItemsJob_)
-        ecore_job_del(emptyItemsJob_);
+    if (deletionJob_)
+        ecore_job_del(deletionJob_);
     for (WView* view : views_)
         view->naviframe_ = nullptr;
 }
@@ -135,7 +135,7 @@ void WNaviframe::itemGone(void*, Evas_Object* naviframe, void* item) {
     auto* self = static_cast<WNaviframe*>(evas_object_data_get(naviframe, selfKey));
     if (!self)
         return;
-    std::erase(self->emptyItems_, item);
+    std::erase(self->itemsToDelete_, item);
     if (WView* view = self->viewOf(static_cast<Elm_Object_Item*>(item)))
         view->naviItem_ = nullptr;
 }
@@ -157,16 +157,16 @@ void WNaviframe::takeAway(Elm_Object_Item* item) {
 }
 
 void WNaviframe::deleteSoon(Elm_Object_Item* item) {
-    emptyItems_.push_back(item);
-    if (!emptyItemsJob_)
-        emptyItemsJob_ = ecore_job_add([](void* self) { static_cast<WNaviframe*>(self)->deleteEmptyItems(); }, this);
+    itemsToDelete_.push_back(item);
+    if (!deletionJob_)
+        deletionJob_ = ecore_job_add([](void* self) { static_cast<WNaviframe*>(self)->deleteItems(); }, this);
 }
 
-void WNaviframe::deleteEmptyItems() {
-    emptyItemsJob_ = nullptr;
-    while (naviframe_ && !emptyItems_.empty()) {
-        Elm_Object_Item* item = emptyItems_.back();
-        emptyItems_.pop_back();
+void WNaviframe::deleteItems() {
+    deletionJob_ = nullptr;
+    while (naviframe_ && !itemsToDelete_.empty()) {
+        Elm_Object_Item* item = itemsToDelete_.back();
+        itemsToDelete_.pop_back();
         elm_object_item_del(item);
     }
     announceTop();

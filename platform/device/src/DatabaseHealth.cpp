@@ -3,6 +3,7 @@
 #include "DatabaseFailure.h"
 #include "Schema.h"
 #include "device/Error.h"
+#include "device/OneLine.h"
 
 #include <algorithm>
 #include <ctime>
@@ -24,11 +25,6 @@ private:
     void set(int on) { sqlite3_db_config(sql_, SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, on, nullptr); }
     sqlite3* sql_;
 };
-
-std::string oneLine(std::string text) {
-    std::replace(text.begin(), text.end(), '\n', ' ');
-    return text;
-}
 
 /// Nothing but our own SQL runs here, so an SQL error too is the fault of the file.
 bool isTheFilesFault(const SQLite::Exception& failure) {
@@ -65,7 +61,7 @@ std::string damageFound(SQLite::Database& sql, const std::filesystem::path& file
     if (!thorough)
         return "";
     const std::string verdict = sql.execAndGet("PRAGMA integrity_check(1)").getString();
-    return verdict == "ok" ? "" : oneLine(verdict);
+    return verdict == "ok" ? "" : oneLine(verdict, verdict.size());
 }
 
 std::string timeStamp() {

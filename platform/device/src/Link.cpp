@@ -6,8 +6,6 @@
 
 #include <algorithm>
 #include <libxml/uri.h>
-#include <map>
-#include <memory>
 #include <optional>
 #include <regex>
 #include <set>
@@ -18,12 +16,9 @@ namespace device {
 namespace {
 
 constexpr std::size_t longestForm = 1000;
-constexpr std::size_t longestShown = 200;
 /// Matching takes memory for each character, and so does a pattern.
 constexpr std::size_t longestPattern = 1000;
 constexpr std::size_t longestMatched = 255;
-
-using Patterns = std::map<std::string, std::string>;
 
 struct UriRelease {
     void operator()(xmlURI* uri) const { xmlFreeURI(uri); }
@@ -66,28 +61,7 @@ std::string decoded(const std::string& name, const std::string& raw) {
 }
 
 std::string quoted(const std::string& text) {
-    return '"' + oneLine(text, longestShown) + '"';
-}
-
-/// The first line is the template.
-std::string templateOf(const std::string& form) {
-    return form.substr(0, form.find('\n'));
-}
-
-/// The lines behind the template, NAME=PATTERN.
-/// Throws Error for what is no such line, and for a name that has two.
-Patterns patternsOf(const std::string& form) {
-    Patterns patterns;
-    const std::vector<std::string> lines = partsOf(form, '\n');
-    for (std::size_t i = 1; i < lines.size(); ++i) {
-        const std::size_t equals = lines[i].find('=');
-        if (equals == std::string::npos)
-            throw Error(quoted(lines[i]) + " is no pattern of a name in links; write NAME=PATTERN");
-        const std::string name = lines[i].substr(0, equals);
-        if (!patterns.emplace(name, lines[i].substr(equals + 1)).second)
-            throw Error("there is a second pattern for " + quoted(name) + " in links; a name has one");
-    }
-    return patterns;
+    return '"' + oneLine(text) + '"';
 }
 
 std::optional<std::regex> regexOf(const std::string& pattern) {
@@ -100,20 +74,6 @@ std::optional<std::regex> regexOf(const std::string& pattern) {
     }
 }
 
-/// Of patterns that are regular expressions. Throws Error for a value that is not of its name's pattern.
-void requireMatches(const Extras& extras, const Patterns& patterns) {
-    for (const auto& [name, value] : extras) {
-        const auto found = patterns.find(name);
-        if (found == patterns.end())
-            continue;
-        if (value.size() > longestMatched)
-            throw Error("its \"" + name + "\" is longer than 255 bytes");
-        if (!std::regex_match(value, *regexOf(found->second)))
-            throw Error("its \"" + name + "\" is " + quoted(value) + ", which does not match " +
-                        oneLine(found->second, longestShown));
-    }
-}
-
 bool hasAuthority(const std::string& uri) {
     const std::size_t colon = uri.find(':');
     return colon != std::string::npos && uri.compare(colon + 1, 2, "//") == 0;
@@ -121,13 +81,17 @@ bool hasAuthority(const std::string& uri) {
 
 }  // namespace
 
+struct Link::Pattern {
+    std::string text;
+    std::regex expression;
+};
+
 Link::Link(const std::string& form) : form_(form) {
     static const std::regex pattern(R"(([A-Za-z][A-Za-z0-9+.-]*):\{(\w+)\}(?:\{\?(\w+(?:,\w+)*)\})?)");
-    const std::string text = templateOf(form);
     std::smatch match;
     // The expression takes memory for each character.
-    if (text.size() > longestForm || !std::regex_match(text, match, pattern))
-        throw Error(quoted(text) + " is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
+    if (form.size() > longestForm || !std::regex_match(form, match, pattern))
+        throw Error(quoted(form) + " is no form of links; write SCHEME:{NAME} or SCHEME:{NAME}{?NAME,NAME}");
     scheme_ = lowered(match[1]);
     first_ = match[2];
     if (match[3].matched)
@@ -135,14 +99,23 @@ Link::Link(const std::string& form) : form_(form) {
     std::set<std::string> names{first_};
     for (const std::string& name : others_)
         if (!names.insert(name).second)
-            throw Error(quoted(text) + " is no form of links: it has the name " + quoted(name) + " twice");
-    for (const auto& [name, values] : patternsOf(form)) {
-        if (!names.contains(name))
-            throw Error("there is a pattern for " + quoted(name) + ", a name that the links " + text + " do not have");
-        if (!regexOf(values))
-            throw Error("the pattern for " + quoted(name) + " in links, " + quoted(values) +
-                        ", is no regular expression of up to 1000 characters");
-    }
+            throw Error(quoted(form) + " is no form of links: it has the name " + quoted(name) + " twice");
+}
+
+void Link::restrict(const std::string& name, const std::string& pattern) {
+    if (name != first_ && std::find(others_.begin(), others_.end(), name) == others_.end())
+        throw Error("there is a pattern for " + quoted(name) + ", a name that the links " + form_ + " do not have");
+    if (patterns_.contains(name))
+        throw Error("there is a second pattern for " + quoted(name) + " in links; a name has one");
+    std::optional<std::regex> expression = regexOf(pattern);
+    if (!expression)
+        throw Error("the pattern for " + quoted(name) + " in links, " + quoted(pattern) +
+                    ", is no regular expression of up to 1000 characters");
+    patterns_.emplace(name, std::make_shared<const Pattern>(Pattern{pattern, *std::move(expression)}));
+}
+
+bool Link::isSchemeOf(const std::string& text) const {
+    return lowered(text.substr(0, scheme_.size() + 1)) == scheme_ + ':';
 }
 
 Extras Link::extrasOf(const std::string& uri) const {
@@ -166,11 +139,23 @@ Extras Link::extrasOf(const std::string& uri) const {
         if (uri.find('?') != std::string::npos)
             for (auto& extra : readQuery(stringOf(parsed->query_raw)))
                 extras.push_back(std::move(extra));
-        requireMatches(extras, patternsOf(form_));
+        requireMatches(extras);
         return extras;
     } catch (const Error& fault) {
-        throw Error("cannot open \"" + oneLine(uri, longestShown) + "\": " + fault.what() +
-                    "; such a link is written " + templateOf(form_));
+        throw Error("cannot open " + quoted(uri) + ": " + fault.what() + "; such a link is written " + form_);
+    }
+}
+
+void Link::requireMatches(const Extras& extras) const {
+    for (const auto& [name, value] : extras) {
+        const auto found = patterns_.find(name);
+        if (found == patterns_.end())
+            continue;
+        if (value.size() > longestMatched)
+            throw Error("its \"" + name + "\" is longer than 255 bytes");
+        if (!std::regex_match(value, found->second->expression))
+            throw Error("its \"" + name + "\" is " + quoted(value) + ", which does not match " +
+                        oneLine(found->second->text));
     }
 }
 
@@ -179,10 +164,10 @@ Extras Link::readQuery(const std::string& query) const {
     for (const std::string& part : partsOf(query, '&')) {
         const std::size_t equals = part.find('=');
         if (equals == std::string::npos)
-            throw Error("its query has \"" + oneLine(part, longestShown) + "\", which is not NAME=VALUE");
+            throw Error("its query has " + quoted(part) + ", which is not NAME=VALUE");
         const std::string name = part.substr(0, equals);
         if (std::find(others_.begin(), others_.end(), name) == others_.end())
-            throw Error("nothing in it may be called \"" + oneLine(name, longestShown) + '"');
+            throw Error("nothing in it may be called " + quoted(name));
         if (std::any_of(extras.begin(), extras.end(), [&](const auto& extra) { return extra.first == name; }))
             throw Error("it gives \"" + name + "\" twice");
         extras.emplace_back(name, decoded(name, part.substr(equals + 1)));

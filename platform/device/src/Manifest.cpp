@@ -147,10 +147,8 @@ void readLinkPattern(Package& package, xmlNode* metadata, const std::filesystem:
     const std::string name = attributeOf(metadata, "key").substr(patternKey.size());
     if (!package.link)
         fail(file, xmlGetLineNo(metadata), "there is a pattern for \"" + name + "\", but no form of links");
-    if (name.find('=') != std::string::npos)
-        fail(file, xmlGetLineNo(metadata), "there is a pattern for \"" + name + "\", which is no name in a link");
     try {
-        package.link = Link(package.link->form() + '\n' + name + '=' + attributeOf(metadata, "value"));
+        package.link->restrict(name, attributeOf(metadata, "value"));
     } catch (const Error& fault) {
         fail(file, xmlGetLineNo(metadata), fault.what());
     }

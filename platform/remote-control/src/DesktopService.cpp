@@ -14,7 +14,6 @@ namespace {
 
 constexpr char interfaceName[] = "org.freedesktop.Application";
 constexpr char stateKey[] = "remote-control desktop";
-constexpr std::size_t longestShown = 200;
 
 }  // namespace
 
@@ -66,7 +65,7 @@ Eldbus_Message* DesktopService::onActivateAction(const Eldbus_Service_Interface*
         Eldbus_Message_Iter* parameter = nullptr;
         Eldbus_Message_Iter* platformData = nullptr;
         arguments(request, "sava{sv}", &action, &parameter, &platformData);
-        throw device::Error(of(interface).appId_ + " has no action \"" + device::oneLine(action, longestShown) + '"');
+        throw device::Error(of(interface).appId_ + " has no action \"" + device::oneLine(action) + '"');
     });
 }
 

@@ -9,8 +9,6 @@ namespace tool {
 
 namespace {
 
-constexpr char caller[] = "kest-device";
-
 constexpr char about[] =
     R"(An application that runs has the request handed over and comes to the front; another one is started, as by
 'kest-device start'. KEY=VALUE words are the request's extras; they pass through no shell. The command returns when the
@@ -50,7 +48,7 @@ void launch(Session& session, const Options& options) {
     request.headless = options.headless;
     session.folder().create();
     const FolderLock lock(session.folder());
-    tell(request, send(session, request, caller), session.folder(), options.json);
+    tell(request, send(session, request), session.folder(), options.json);
 }
 
 }  // namespace

@@ -39,8 +39,6 @@ constexpr char clearAbout[] = R"(Takes all of them off the device and off the de
 Example:
   kest-device notifications clear)";
 
-constexpr char caller[] = "kest-device";
-
 struct Options {
     bool json = false;
     long long id = 0;
@@ -109,10 +107,10 @@ void open(Session& session, const Options& options) {
         throw device::Error("notification " + std::to_string(options.id) + " opens nothing: it has no launch request");
     }
     const LaunchRequest request{notification->launchAppId, notification->launchExtras, options.headless};
-    if (const std::string fault = device::faultOf({caller, request.appId, request.extras}); !fault.empty()) {
+    if (const std::string fault = device::faultOf({"", request.appId, request.extras}); !fault.empty()) {
         throw device::Error("notification " + std::to_string(options.id) + " cannot be opened: " + fault);
     }
-    const Launched launched = send(session, request, caller);
+    const Launched launched = send(session, request);
     device.presenter().takeDown(options.id);
     device.notifications().remove(options.id);
     std::cout << "opened notification " << options.id << ": " << request.appId

@@ -18,9 +18,11 @@ public:
 
     /// Makes the process an application of the device (its language, text domain, display, theme and bus), runs
     /// onStart, onCreate, the first onAppControl from inside the main loop, and the main loop until it ends,
-    /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request.
+    /// then onTerminate. `argv` holds KEY=VALUE words, the extras of the first launch request; or one word alone: a
+    /// link of the application, or "--dbus-activated", with which the bus starts it for a request that it then brings.
     /// Returns the process's exit status: 0; 1 when the device cannot be opened, when there is no display, when the
-    /// bus has another device, or when onCreate returned false; 2 for a word that is no KEY=VALUE. Each is said on
+    /// bus has another device or is missing for "--dbus-activated", or when onCreate returned false; 2 for words that
+    /// are no launch request: of another form, an extra given twice, not UTF-8 or more than 64 KiB. Each is said on
     /// standard error.
     /// Where another process of the same device is the application, that one gets the launch request, which is said and
     /// gives 0; 1 when it cannot be handed over.

@@ -46,7 +46,7 @@ private:
     void takeAway(Elm_Object_Item* item);
     void deleteSoon(Elm_Object_Item* item);
     void announceTop();
-    void deleteEmptyItems();
+    void deleteItems();
     WView* viewOf(const Elm_Object_Item* item) const;
 
     static Eina_Bool itemPops(void* naviframe, Elm_Object_Item* item);
@@ -57,8 +57,8 @@ private:
     std::unique_ptr<BackKeys> backKeys_;
     std::vector<WView*> views_;
     /// Items on the stack that are to go: their views are gone, or they were popped and are covered.
-    std::vector<Elm_Object_Item*> emptyItems_;
-    Ecore_Job* emptyItemsJob_ = nullptr;
+    std::vector<Elm_Object_Item*> itemsToDelete_;
+    Ecore_Job* deletionJob_ = nullptr;
     const WView* announced_ = nullptr;
 };
 
