@@ -32,6 +32,16 @@ TEST_F(Cache, IsInvalidWithoutALineWhenItHasNoLanguage) {
                                    begin("__loadStringResource"), hit("__saveToPreference")));
 }
 
+TEST_F(Cache, IsAskedForItsLanguageBeforeTheDeviceIs) {
+    writeTip("<title>A</title>");
+    device()->preferences().clear(kest);
+    device()->settings().remove(device::keys::language);
+    loadAtNextStart();
+    EXPECT_THAT(log(), ElementsAre(begin("loadContentsList"), begin("__loadMainMenu"), begin("__loadDetailMenu"),
+                                   begin("__loadStringResource"), hit("__saveToPreference")));
+    EXPECT_EQ(preference("KestCurrentLanguage"), std::nullopt);
+}
+
 TEST_F(Cache, IsInvalidForAnotherLanguage) {
     fill();
     setLanguage("ko_KR.UTF-8");

@@ -121,6 +121,8 @@ TEST_F(StringFile, IsRememberedWhenItHasGone) {
 TEST_F(StringFile, DoesNotKeepAnEntryWithoutAnId) {
     writeStrings({{"en_US", "", "Nothing's text"}});
     EXPECT_EQ(titleOf(""), "untranslated");
+    // Under its region alone it would pass for that language's text of this id.
+    EXPECT_EQ(titleOf("US_"), "untranslated");
 }
 
 TEST_F(StringFile, MayHoldAnEmptyText) {

@@ -57,6 +57,11 @@ TEST_F(Translation, OfTheApplicationsNameFollowsTheSameRule) {
     EXPECT_EQ(loadTip("<appname>plain</appname>").appName, "plain");
 }
 
+TEST_F(Translation, OfTheApplicationsNameComesFromTheTipsDomainToo) {
+    EXPECT_EQ(loadTip("<textdomain>tips</textdomain><appname id=\"IDS_TIPS\">untranslated</appname>").appName,
+              "Text of the tips");
+}
+
 TEST_F(Translation, OfTheApplicationsNameKeepsNoId) {
     EXPECT_EQ(loadTip("<appname id=\"IDS_OWN\">untranslated</appname>").titleId, "");
 }
@@ -70,6 +75,11 @@ TEST_F(Translation, ComesFromTheApplicationFirst) {
 TEST_F(Translation, ComesFromTheTipsDomainBeforeTheSystems) {
     EXPECT_EQ(titleOf("IDS_TIPS_AND_SYSTEM"), "both, from the tips");
     EXPECT_EQ(textOf("IDS_TIPS_AND_SYSTEM"), "both, from the tips");
+}
+
+TEST_F(Translation, ByTheApplicationThatIsTheIdItselfIsNone) {
+    EXPECT_EQ(titleOf("IDS_SELF"), "Itself, from the tips");
+    EXPECT_EQ(textOf("IDS_SELF"), "Itself, from the tips");
 }
 
 TEST_F(Translation, ComesFromTheSystemBeforeTheStringFile) {

@@ -46,6 +46,23 @@ TEST_F(Life, AddsTheThemesFileOnceForTwoViews) {
     EXPECT_EQ(eina_list_count(all), 1U);
 }
 
+TEST_F(Life, TakesTheThemesFileOfTheDisplaysDensity) {
+    const auto theme = device().appRoot() / "res/LDPI/edje/kest.edj";
+    std::filesystem::create_directories(theme.parent_path());
+    std::filesystem::copy_file(device().appRoot() / "res/edje/kest.edj", theme);
+    device()->settings().set(device::keys::screen, "480x800");
+    startEmpty();
+    calls::made().themeExtensions.clear();
+    auto* view = new KestMainView(true);
+    EXPECT_THAT(calls::made().themeExtensions, ElementsAre(theme.string()));
+    naviframe().push(view, nullptr, nullptr);
+    const char* file = nullptr;
+    const char* group = nullptr;
+    elm_layout_file_get(view->getEvasObj(), &file, &group);
+    EXPECT_STREQ(file, theme.c_str());
+    EXPECT_STREQ(group, "kest/list/main");
+}
+
 TEST_F(Life, RegistersAndTakesBackItsCallbacks) {
     writeTips({"A"});
     start();
@@ -105,6 +122,16 @@ TEST_F(Life, SlidesInBeneathWhenItIsPushedSo) {
     settle();
     EXPECT_EQ(topView(), "KestMainView");
     EXPECT_EQ(test_ui::rows(list()).size(), 2U);
+}
+
+TEST_F(Life, IsPushedPlainlyWhereNothingIsThereToSlideInBeneath) {
+    writeTips({"A"});
+    startEmpty();
+    naviframe().push(new KestMainView(false), nullptr, nullptr);
+    settle();
+    EXPECT_EQ(topView(), "KestMainView");
+    EXPECT_EQ(levels(), 1U);
+    EXPECT_EQ(menuTexts(), std::vector<Texts>({{"Name of A", "A"}}));
 }
 
 TEST_F(Life, SlidesInBeneathAllViews) {

@@ -3,6 +3,7 @@
 #include <Elementary.h>
 #include <app-assist/WApp.h>
 #include <app-assist/WAppEventHandler.h>
+#include <app-assist/WUiTimer.h>
 #include <app_extension.h>
 #include <app_resource_manager.h>
 #include <ravella-log-client.h>
@@ -75,6 +76,20 @@ void addAndNoteEventHandler(EventHandler* self, app_event_type_e type, EventHand
     addEventHandler(self, type, std::move(handler), data);
 }
 
+// WUiTimer::addIdler(), likewise.
+#define ADD_IDLER "_ZN10app_assist8WUiTimer8addIdlerESt8functionIFbPNS_5WViewEEES3_P10_Eo_Opaque"
+
+using app_assist::WUiTimer;
+WUiTimer::Handle addIdler(WUiTimer::Function function, app_assist::WView* view,
+                          Evas_Object* owner) __asm__("__real_" ADD_IDLER);
+WUiTimer::Handle addAndNoteIdler(WUiTimer::Function function, app_assist::WView* view,
+                                 Evas_Object* owner) __asm__("__wrap_" ADD_IDLER);
+
+WUiTimer::Handle addAndNoteIdler(WUiTimer::Function function, app_assist::WView* view, Evas_Object* owner) {
+    note("addIdler", orNull(owner ? elm_object_widget_type_get(owner) : nullptr));
+    return addIdler(std::move(function), view, owner);
+}
+
 CALL(Evas_Object*, elm_naviframe_add, Evas_Object* parent) {
     note("elm_naviframe_add");
     return __real_elm_naviframe_add(parent);
@@ -115,7 +130,8 @@ CALL(int, ravella_log_manager_create, ravella_log_manager_h* handle) {
 
 CALL(int, ravella_log_manager_insert, ravella_log_manager_h handle, const char* uri, bundle* record,
      ravella_log_insert_cb callback, void* data, int* request) {
-    note("ravella_log_manager_insert", uri, callback ? "callback" : "null", orNull(data, "data"));
+    note("ravella_log_manager_insert", uri, callback ? "callback" : "null", orNull(data, "data"),
+         orNull(request, "number"));
     return __real_ravella_log_manager_insert(handle, uri, record, callback, data, request);
 }
 

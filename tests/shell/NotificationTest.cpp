@@ -70,9 +70,11 @@ TEST_F(NotificationTest, IsKeptOnTheDevice) {
 }
 
 TEST_F(NotificationTest, EndsTheApplication) {
+    writeCatalogue();
     drawIcon();
     start(asked_);
     EXPECT_TRUE(test_ui::hasEnded());
+    EXPECT_THAT(views(), ElementsAre("KestMainView")) << "the rest of the request is carried out";
     EXPECT_THAT(newLines(),
                 IsSupersetOf({begin(), RequestTest::info("Appcontrol case from addNoti"),
                               info("__addKestNotification", "Inside add_notification"),

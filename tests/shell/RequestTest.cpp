@@ -2,6 +2,7 @@
 
 #include <app-assist/WWindow.h>
 
+#include <algorithm>
 #include <map>
 
 using testing::Contains;
@@ -132,12 +133,28 @@ TEST_F(RequestTest, LeadsBackToTheList) {
 TEST_F(RequestTest, PushesThePagerFirstAndTheListWhenTheMainLoopIsIdle) {
     writeCatalogue();
     startWithoutView();
+    calls::forget();
     test_ui::inMainLoop([&] {
         requestAtOnce({{"appID", clockId}}, true);
         EXPECT_THAT(views(), ElementsAre("KestContentView"));
+        EXPECT_THAT(calls::madeOf({"addIdler"}), Contains("addIdler Elm_Naviframe"));
     });
     settle();
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
+}
+
+TEST_F(RequestTest, MakesTheListBeforeThePager) {
+    writeCatalogue();
+    startWithoutView();
+    newLog();
+    requestAtOnce({{"appID", clockId}}, true);
+    const auto lines = newLog();
+    const auto list = std::find(
+        lines.begin(), lines.end(),
+        kest_log::info("KestCommon.cpp", "getEdjFilePath", "edje resource path[" + resource("edje/kest.edj") + "]"));
+    const auto pager = std::find(lines.begin(), lines.end(), kest_log::begin("KestContentView.cpp", "KestContentView"));
+    ASSERT_NE(pager, lines.end());
+    EXPECT_LT(list, pager);
 }
 
 TEST_F(RequestTest, OpensAllTipsOfTheApplicationFromThatPageOnOverOneList) {

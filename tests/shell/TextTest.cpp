@@ -37,6 +37,11 @@ TEST_F(Text, ThatContactsDoNotHaveEitherIsItsId) {
     EXPECT_THAT(log(), IsEmpty());
 }
 
+TEST_F(Text, OfTheApplicationsOwnThatIsItsIdIsLookedForInContacts) {
+    EXPECT_EQ(KestCommon::findProperDomain("IDS_SELF"), "contacts");
+    EXPECT_EQ(KestCommon::translateString("IDS_SELF"), "Itself, from the contacts");
+}
+
 TEST_F(Text, OfTheSystemIsNotLookedFor) {
     EXPECT_EQ(KestCommon::findProperDomain("IDS_SYSTEM"), "contacts");
     EXPECT_EQ(KestCommon::translateString("IDS_SYSTEM"), "IDS_SYSTEM");

@@ -30,10 +30,11 @@ TEST_F(UsageLog, GetsAnEmptyTitleToo) {
 TEST_F(UsageLog, IsOpenedAndClosedForEachRecord) {
     KestUsageLog::menuChosen("A");
     const std::string uri = device()->usage().all().at(0).uri;
-    EXPECT_THAT(calls::made(), ElementsAre("ravella_log_manager_create", "bundle_create",
-                                           "bundle_add_str app_id com.ravella.kest", "bundle_add_str feature KT01",
-                                           "bundle_add_str extra A", "ravella_log_manager_insert " + uri + " null null",
-                                           "bundle_free", "ravella_log_manager_destroy"));
+    EXPECT_THAT(calls::made(),
+                ElementsAre("ravella_log_manager_create", "bundle_create", "bundle_add_str app_id com.ravella.kest",
+                            "bundle_add_str feature KT01", "bundle_add_str extra A",
+                            "ravella_log_manager_insert " + uri + " null null number", "bundle_free",
+                            "ravella_log_manager_destroy"));
     calls::forget();
     KestUsageLog::menuChosen("B");
     EXPECT_EQ(calls::made().size(), 8U);
