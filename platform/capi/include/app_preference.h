@@ -15,7 +15,9 @@ typedef enum {
 } preference_error_e;
 
 /**
- * Stores a string in the calling application's preferences; an old value is replaced.
+ * Stores a string in the calling application's preferences; an old value is replaced. A value that could not be
+ * written is tried again before the next one and at the application's end. When more than 4 MiB could not be written,
+ * all of that is given up, and every further call fails.
  * @return PREFERENCE_ERROR_NONE; INVALID_PARAMETER for a NULL argument; OUT_OF_MEMORY; IO_ERROR when it could not
  *         be written
  */

@@ -25,7 +25,8 @@ typedef enum {
  * name below res/LDPI/ when there is one, else the file below res/.
  * @param id path relative to res/, for example "edje/app.edj"
  * @param[out] path absolute path of an existing file, to be freed with free(); set to NULL on error
- * @return APP_RESOURCE_ERROR_NONE; IO_ERROR when there is no such file; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ * @return APP_RESOURCE_ERROR_NONE; IO_ERROR when there is no such file, or the device cannot be opened or read;
+ *         INVALID_PARAMETER for NULL; OUT_OF_MEMORY
  */
 int app_resource_manager_get(app_resource_e type, const char* id, char** path);
 

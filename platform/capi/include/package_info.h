@@ -46,7 +46,8 @@ int package_info_get_icon(package_info_h info, char** path);
 /**
  * Gives the name of the package's application, for people: in the display language where the manifest has it in that.
  * @param[out] label the package's id where the manifest gives none; to be freed with free(); untouched on error
- * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY
+ * @return PACKAGE_MANAGER_ERROR_NONE; INVALID_PARAMETER for NULL; OUT_OF_MEMORY; IO_ERROR when the device's display
+ *         language cannot be read
  */
 int package_info_get_label(package_info_h info, char** label);
 

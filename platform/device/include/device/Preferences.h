@@ -13,7 +13,8 @@ namespace device {
 
 class Database;
 
-/// The private key-value store of every application. Keeps no copy. All throw Error when the database fails.
+/// The private key-value store of every application. What the database holds is not copied here; what it could not
+/// take from setInOrder() waits here. All throw Error when the database fails.
 class Preferences {
 public:
     explicit Preferences(Database& database) : database_(database) {}
