@@ -1,6 +1,7 @@
 #include "Calls.h"
 
 #include <app_control.h>
+#include <app_resource_manager.h>
 #include <ravella-log-client.h>
 
 #include <algorithm>
@@ -28,6 +29,7 @@ std::map<std::string, int> throwing;
 std::map<std::string, Evas_Smart_Cb> smartCallbacks;
 uxt_theme_changed_cb lastThemeCallback = nullptr;
 int screenWidth = 0;
+std::vector<const Evas_Object*> windowsAsked;
 
 template <class... Arguments>
 void note(const Arguments&... arguments) {
@@ -103,6 +105,7 @@ void calls::forget() {
     begin = ecore_time_get();
     events.clear();
     otherCalls.clear();
+    windowsAsked.clear();
 }
 
 std::vector<std::string> calls::story(int page) {
@@ -146,6 +149,10 @@ void calls::throwIfDue(const std::string& name) {
 
 void calls::setScreenWidth(int width) {
     screenWidth = width;
+}
+
+std::vector<const Evas_Object*> calls::windowsAskedForTheScreen() {
+    return windowsAsked;
 }
 
 Evas_Smart_Cb calls::smartCallback(const std::string& event) {
@@ -194,6 +201,7 @@ CALL(void, elm_scroller_region_show, Evas_Object* scroller, int x, int y, int wi
 }
 
 CALL(void, elm_win_screen_size_get, const Evas_Object* window, int* x, int* y, int* width, int* height) {
+    windowsAsked.push_back(window);
     __real_elm_win_screen_size_get(window, x, y, width, height);
     if (width && screenWidth > 0)
         *width = screenWidth;
@@ -286,4 +294,9 @@ CALL(int, app_control_send_launch_request, app_control_h request, app_control_re
 CALL(int, app_control_destroy, app_control_h request) {
     note("launch destroy");
     return __real_app_control_destroy(request);
+}
+
+CALL(int, app_resource_manager_get, app_resource_e type, const char* id, char** path) {
+    note("resource", type, orNull(id));
+    return __real_app_resource_manager_get(type, id, path);
 }

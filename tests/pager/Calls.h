@@ -22,7 +22,7 @@ std::vector<std::string> story(int page = 0);
 /// The story of all pages in one: "0.0 page 2: pictures at page 0".
 std::vector<std::string> wholeStory();
 
-/// Other calls in their order, those that begin with one of these words: "title", "launch", "record", "theme", ...
+/// Other calls in their order, those that begin with one of these words: "title", "launch", "resource", "theme", ...
 std::vector<std::string> steps(const std::vector<std::string>& words);
 
 /// Has the call of that name give nothing, the how-manieth time from now.
@@ -34,6 +34,8 @@ void throwIfDue(const std::string& name);
 
 /// Has the display be that wide for who asks; 0: as wide as it is.
 void setScreenWidth(int width);
+/// The windows whose display was asked for its size since forget(), one a question; null for a question without one.
+std::vector<const Evas_Object*> windowsAskedForTheScreen();
 
 /// The callback that was registered last for that smart event.
 Evas_Smart_Cb smartCallback(const std::string& event);

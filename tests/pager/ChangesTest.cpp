@@ -287,6 +287,24 @@ TEST_F(Shrinking, LeavesPagesThatAreNotFilledYetEmpty) {
     EXPECT_THAT(newErrors(), IsEmpty());
 }
 
+TEST_F(Shrinking, LeavesAPageThatWasNotFilledEmptyAtAChangeOfTheLanguage) {
+    // To write an empty text leaves a line.
+    const std::vector<std::string> tips = {titled("A"), titled("B", "")};
+    writeTips(tips);
+    open();
+    reload({titled("New")});
+    test_ui::runFor(1);
+    ASSERT_EQ(info(1), nullptr);
+    reload(tips);
+    newLog();
+    setLanguage("ko_KR.UTF-8");
+    test_ui::runFor(1);
+    ASSERT_EQ(KestContentMgr::getInstance()->getContentsList().at(1).textContents, "");
+    EXPECT_EQ(info(1), nullptr);
+    EXPECT_THAT(newLogOf(pager_log::pageFile),
+                ElementsAre(hit("__languageChangedCb"), hit("__languageChangedCb"), display()));
+}
+
 TEST_F(Shrinking, ToNothingLeavesThePageInView) {
     writeTips({titled("A", "Text A")});
     openAtRest();

@@ -2,6 +2,8 @@
 
 #include "KestMainView.h"
 
+#include <utility>
+
 using testing::AllOf;
 using testing::Contains;
 using testing::ElementsAre;
@@ -23,6 +25,12 @@ protected:
         for (int index = 0; index < count; ++index)
             tips.push_back(tip("none.png", "Text of page " + std::to_string(index)));
         writeTips(tips);
+    }
+    /// How an object shares the room of its container: across and down.
+    static std::pair<double, double> weightOf(const Evas_Object* object) {
+        std::pair<double, double> weight;
+        evas_object_size_hint_weight_get(object, &weight.first, &weight.second);
+        return weight;
     }
     /// How many transitions of the naviframe come to their end within a second.
     int transitions() {
@@ -120,6 +128,15 @@ TEST_F(Opening, SetsItsScrollerUpInOrder) {
                             "bounce on off", "bars off off", "auto scroll off"));
 }
 
+TEST_F(Opening, WantsAllOfTheRoomForItselfAndForEachPage) {
+    writeTipsOfNumber(2);
+    open();
+    const std::pair<double, double> all{EVAS_HINT_EXPAND, EVAS_HINT_EXPAND};
+    EXPECT_EQ(weightOf(pager().getEvasObj()), all);
+    EXPECT_EQ(weightOf(page(0)), all);
+    EXPECT_EQ(weightOf(page(1)), all);
+}
+
 TEST_F(Opening, OnTopSlidesIn) {
     writeTipsOfNumber(2);
     startEmpty();
@@ -163,6 +180,7 @@ TEST_F(Opening, HasABackButtonThatClosesIt) {
     settle();
     Evas_Object* back = elm_object_item_part_content_get(pager().getNaviItem(), "elm.swallow.prev_btn");
     EXPECT_STREQ(elm_object_style_get(back), "naviframe/back_btn/default");
+    EXPECT_EQ(test_ui::text(back), "");
     screen().tap(back);
     settle();
     EXPECT_EQ(topView(), "OtherView");

@@ -97,6 +97,18 @@ TEST_F(PictureVariant, OfTheSmallDisplayIs478x369) {
     }
 }
 
+TEST_F(PictureVariant, IsAsWideAsTheDisplayOfTheApplicationsWindow) {
+    drawSequence(2);
+    openPage();
+    EXPECT_THAT(calls::windowsAskedForTheScreen(), ElementsAre(running().window(), running().window()));
+}
+
+TEST_F(PictureVariant, OfALowDensityDisplayIsToldByTheImageResourceOfTheColours) {
+    drawPicture("a_01.png", 716, 800);
+    openPage();
+    EXPECT_THAT(calls::steps({"resource"}), Contains("resource 0 table/com.ravella.kest_ChangeableColorInfo.xml"));
+}
+
 TEST_F(PictureVariant, OfALowDensityDisplayIsATallPicture138PixelsLower) {
     drawPicture("a_01.png", 716, 1000);
     useSmallScreen();

@@ -51,6 +51,15 @@ TEST_F(Preparation, FillsTheOthersAfterFourTenthsOfASecond) {
     EXPECT_THAT(newLog(), Contains(loadsOthers()));
 }
 
+TEST_F(Preparation, ShowsThePageThatItFills) {
+    push(0, true, [this](Pager&) { evas_object_hide(page(1)); });
+    test_ui::runFor(0.35);
+    ASSERT_FALSE(evas_object_visible_get(page(1)));
+    test_ui::runFor(0.1);
+    EXPECT_TRUE(isFilled(1));
+    EXPECT_TRUE(evas_object_visible_get(page(1)));
+}
+
 TEST_F(Preparation, FillsEachPageOnce) {
     open();
     test_ui::runFor(10);

@@ -132,6 +132,16 @@ TEST_F(TallPicture, ThatSomethingBroughtBackScrollsDownAgain) {
                                             "2.5 area reply,show"));
 }
 
+TEST_F(TallPicture, ThatSomethingScrolledDownComesBackInstead) {
+    play(800, 1);
+    elm_scroller_region_show(pictureScroller(), 0, 60, 716, 655);
+    ASSERT_EQ(scrolledTo(), 60);
+    calls::forget();
+    test_ui::runFor(20);
+    EXPECT_THAT(calls::story(), ElementsAre("1.0 pictures to y 0", "1.0 area reply,show"));
+    EXPECT_EQ(scrolledTo(), 0);
+}
+
 TEST_F(TallPicture, GivesItsButtonBackWhereTheDisplayShowsAllOfIt) {
     useSmallScreen();
     play(760, 20);
