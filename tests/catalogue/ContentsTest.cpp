@@ -87,6 +87,11 @@ TEST_F(Contents, OfTheOldStyleLoseALaterItemThatIsTheSameAsTheFirstNot) {
     EXPECT_EQ(loadContents("<item 1></item>-<item 1></item>"), "-<item 1></item>");
 }
 
+TEST_F(Contents, OfTheOldStyleLoseALaterTextThatIsTheSameAsTheTitleNot) {
+    const std::string title = textTag("IDS_SYSTEM");
+    EXPECT_EQ(loadContents("<item 1></item>" + title + "-" + title), "-System text");
+}
+
 TEST_F(Contents, OfTheOldStyleMayHaveTheirTitleBeforeTheItem) {
     EXPECT_EQ(loadContents("<text id=\"IDS_A\">b</text><br/><item x></item>end"), "end");
 }
@@ -112,13 +117,20 @@ TEST_F(Contents, ReferToTheFilesOfTheirApplication) {
     EXPECT_EQ(load().at(0).textContents, "href=file:/" + resources("com.example.clock").string() + "/a.png");
 }
 
+TEST_F(Contents, OfAnotherApplicationAreAttachedWithFilesOfIt) {
+    addApplication("com.example.clock");
+    writeMenus({{tipPath, "com.example.clock"}});
+    writeDetail(contents("ICON") + attach("ICON", "href=file:a.png"), tipPath, "com.example.clock");
+    EXPECT_EQ(load().at(0).textContents, "href=file:/" + resources("com.example.clock").string() + "/a.png");
+}
+
 TEST_F(Contents, ReferToTheFilesOfTranslationsToo) {
     writeStrings({{"en_US", "IDS_PICTURE", "<item href=file:a.png></item>"}});
     EXPECT_EQ(loadContents(textTag("IDS_PICTURE")), "<item href=file:/" + folder() + "a.png></item>");
 }
 
 TEST_F(Contents, StayUntouchedWhenNothingIsLeftOfThem) {
-    const std::string markup = "<item a></item>" + textTag("IDS_SYSTEM") + "<br/>";
+    const std::string markup = "<item href=file:a.png></item>" + textTag("IDS_SYSTEM") + "<br/>";
     EXPECT_EQ(loadContents(markup), markup);
     EXPECT_TRUE(wereOldStyle());
 }

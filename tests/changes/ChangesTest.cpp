@@ -77,7 +77,7 @@ void ChangesTest::begin(const std::vector<std::string>& words) {
 
 void ChangesTest::beginAtOnce(const std::vector<std::string>& words) {
     running_.emplace(app_, words);
-    use_.emplace(running().window());
+    undrawn_.emplace(running().window());
 }
 
 void ChangesTest::request(const Extras& extras) {
@@ -181,8 +181,6 @@ Evas_Object* ChangesTest::pictureArea() {
 }
 
 unsigned int ChangesTest::ground(int y) {
-    // Nothing has been drawn so far.
-    evas_damage_rectangle_add(screen().canvas(), 0, 0, screenWidth, y + 1);
     return screen().picture().pixel(screenWidth - 1, y);
 }
 

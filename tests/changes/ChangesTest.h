@@ -3,7 +3,7 @@
 #include "Tips.h"
 
 #include "kest/KestUiTest.h"
-#include "ui/LongUse.h"
+#include "ui/Undrawn.h"
 
 #include <device/Keys.h>
 
@@ -53,7 +53,7 @@ protected:
     /// The list's rows below its title, each "<title>, <application>". The list must be on the top.
     std::vector<std::string> rows();
     static std::vector<std::string> rowsOf(const Names& names, Language language);
-    /// How the page of a tip reads: "page Tips 2/12: Alarm, How to use Alarm".
+    /// How the page of a tip reads: "page Tips 2/10: Alarm, How to use Alarm".
     static std::string pageOf(const std::string& name, const Names& names, Language language);
     /// The colour (0xRRGGBB) at the right edge of the screen, where only grounds are.
     unsigned int ground(int y);
@@ -80,7 +80,7 @@ private:
     Evas_Object* onPage(const std::string& type);
     Evas_Object* pictureArea();
 
-    std::optional<test_ui::LongUse> use_;
+    std::optional<test_ui::Undrawn> undrawn_;
     std::size_t recordsRead_ = 0;
     int packages_ = 0;
 };

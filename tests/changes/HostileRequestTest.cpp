@@ -25,7 +25,7 @@ Hostile alarmAtPage(const std::string& name, const std::string& page) {
 /// Every tip of the application is opened, one after the other.
 Hostile opensAll(const std::string& name, const std::string& page) {
     Hostile request = alarmAtPage(name, page);
-    request.top = "page Tips 3/12: Snooze, How to use Snooze";
+    request.top = "page Tips 3/10: Snooze, How to use Snooze";
     request.records = {"KT03 Alarm", "KT03 Snooze"};
     return request;
 }
@@ -71,7 +71,7 @@ TEST_P(HostileRequest, ComesToNoHarm) {
     EXPECT_EQ(newRecords(), GetParam().records);
     request({{"appID", "com.example.music"}});
     test_ui::runFor(0.35);
-    EXPECT_EQ(top(), "page Tips 4/12: Music, How to use Music");
+    EXPECT_EQ(top(), "page Tips 4/10: Music, How to use Music");
     back();
     test_ui::runFor(0.7);
     EXPECT_EQ(top(), "list Tips: Tips and guidelines");
@@ -85,6 +85,6 @@ TEST_F(FirstRequest, WithHostileExtrasShowsNothingAndLeavesTheNextOneAlone) {
     EXPECT_EQ(top(), "nothing");
     request({{"appID", "com.example.music"}});
     test_ui::runFor(1);
-    EXPECT_EQ(top(), "page Tips 4/12: Music, How to use Music");
+    EXPECT_EQ(top(), "page Tips 4/10: Music, How to use Music");
     EXPECT_THAT(newErrors(), IsEmpty());
 }

@@ -5,8 +5,8 @@
 class LanguageChange : public ChangeTest {};
 
 INSTANTIATE_TEST_SUITE_P(Changes, LanguageChange,
-                         testing::ValuesIn(ChangeTest::cellsWhereThePagerCloses("list 팁: 팁 및 안내", "list 팁: 걸음",
-                                                                                "page 12개 중 2: 알람, 알람 사용법")),
+                         testing::ValuesIn(ChangeTest::cellsWhereThePagerCloses("list 팁: 팁 및 안내", "list 팁: 음악",
+                                                                                "page 10개 중 2: 알람, 알람 사용법")),
                          ChangeTest::nameOfCell);
 
 TEST_P(LanguageChange, IsReadEverywhere) {

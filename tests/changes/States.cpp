@@ -33,12 +33,12 @@ std::string nameOf(State state) {
 }
 
 std::vector<Cell> ChangeTest::cellsWhereNothingMoves() {
-    return cellsWhereThePagerCounts("list Tips: Steps", "12", "Music");
+    return cellsWhereThePagerCounts("list Tips: Music", "10", "Music");
 }
 
 std::vector<Cell> ChangeTest::cellsWhereThePagerCloses() {
     const std::string list = "list Tips: Tips and guidelines";
-    return cellsWhereThePagerCloses(list, list, "page Tips 2/12: Alarm, How to use Alarm");
+    return cellsWhereThePagerCloses(list, list, "page Tips 2/10: Alarm, How to use Alarm");
 }
 
 std::vector<Cell> ChangeTest::cellsWhereThePagerCloses(const std::string& list, const std::string& scrolledList,
@@ -66,10 +66,10 @@ std::vector<Cell> ChangeTest::cellsWhereThePagerCounts(const std::string& scroll
         {State::PicturesPlay, second},
         {State::FingerSwipes, fourth},
         {State::PagesGlide, fourth},
-        {State::RequestedPagerComes, "page Tips 3/12: Snooze, How to use Snooze"},
-        {State::RequestedPager, "page Tips 3/12: Snooze, How to use Snooze"},
-        {State::RequestedPagers, "page Tips 3/12: Snooze, How to use Snooze"},
-        {State::TurnedPager, "page Tips 4/12: Music, How to use Music"},
+        {State::RequestedPagerComes, "page Tips 3/10: Snooze, How to use Snooze"},
+        {State::RequestedPager, "page Tips 3/10: Snooze, How to use Snooze"},
+        {State::RequestedPagers, "page Tips 3/10: Snooze, How to use Snooze"},
+        {State::TurnedPager, "page Tips 4/10: Music, How to use Music"},
         {State::Nothing, "nothing"},
     };
 }

@@ -2,6 +2,8 @@
 #include "ChangesTest.h"
 #include "StormModel.h"
 
+#include "ui/LongUse.h"
+
 #include <algorithm>
 #include <iostream>
 #include <random>

@@ -29,9 +29,7 @@ const std::vector<Tip>& all() {
         {"Cricket", "크리켓", kest, "India"},
         {"Steps", "걸음"},
         {"Heart", "심박"},
-        {"Sleep", "수면"},
         {"Notes", "메모"},
-        {"Calls", "전화"},
         {"Photos", "사진"},
         {"Torch", "손전등"},
         {"Power", "전원"},
@@ -45,8 +43,7 @@ const Tip& named(const std::string& name) {
 }
 
 std::vector<std::string> atFirst() {
-    return {"Clock", "Alarm", "Snooze", "Music", "Mail",   "Steps",
-            "Heart", "Sleep", "Notes",  "Calls", "Photos", "Power"};
+    return {"Clock", "Alarm", "Snooze", "Music", "Mail", "Steps", "Heart", "Notes", "Photos", "Power"};
 }
 
 std::vector<std::string> without(std::vector<std::string> names, const std::string& name) {

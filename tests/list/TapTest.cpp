@@ -21,6 +21,17 @@ TEST_F(Tap, OnTheFirstMenuOpensThePagerAtIt) {
     EXPECT_EQ(topView(), "KestContentView");
 }
 
+TEST_F(Tap, SlidesThePagerIn) {
+    writeTips({"A"});
+    start();
+    int finished = 0;
+    evas_object_smart_callback_add(
+        naviframe().getEvasObj(), "transition,finished",
+        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    openPager();
+    EXPECT_EQ(finished, 1);
+}
+
 TEST_F(Tap, OnALaterMenuOpensThePagerAtThatOne) {
     writeTips({"A", "B", "C"});
     start();

@@ -5,10 +5,12 @@
 #include "KestContentView.h"
 
 #include "kest/KestUiTest.h"
+#include "ui/Undrawn.h"
 
 #include <gmock/gmock.h>
 
 #include <functional>
+#include <optional>
 #include <set>
 #include <string>
 #include <vector>
@@ -85,9 +87,12 @@ protected:
 
     static std::string fileOf(const Evas_Object* image);
 
+    bool isDrawn_ = false;  ///< true: each frame is drawn, for tests of what drawing takes
+
 private:
     void say(const char* signal, int index);
 
+    std::optional<test_ui::Undrawn> undrawn_;
     Pager* pager_ = nullptr;
 };
 

@@ -14,7 +14,10 @@ protected:
         }
     };
 
-    PictureTest() { drawPicture("../contents_not_released.png"); }
+    PictureTest() {
+        isDrawn_ = true;
+        drawPicture("../contents_not_released.png");
+    }
 
     /// Opens a page of that picture.
     void openPage(const std::string& picture = "a_01.png") {

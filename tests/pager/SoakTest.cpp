@@ -18,6 +18,7 @@ constexpr unsigned int seed = 20150401;
 class Soak : public PagerTest, public testing::WithParamInterface<std::string> {
 protected:
     Soak() {
+        isDrawn_ = true;  // but for what LongUse leaves out
         setLanguage(GetParam());
         drawSequence(3, {0, 1});
         for (const char* name : {"a_russia_01.png", "b_01.png", "b_02.png", "plain.png"})

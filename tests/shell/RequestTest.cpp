@@ -165,6 +165,18 @@ TEST_F(RequestTest, OpensAllTipsOfTheApplicationFromThatPageOnOverOneList) {
     EXPECT_THAT(usage(), ElementsAre("KT03 Close", "KT03 Lock"));
 }
 
+TEST_F(RequestTest, SlidesFurtherPagersInOverTheFirst) {
+    writeCatalogue();
+    startWithoutView();
+    int finished = 0;
+    evas_object_smart_callback_add(
+        naviframe().getEvasObj(), "transition,finished",
+        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    test_ui::inMainLoop([&] { requestAtOnce({{"appID", doorId}, {"page", "2"}}, true); });
+    settle();
+    EXPECT_EQ(finished, 1);
+}
+
 TEST_F(RequestTest, OpensThemOneAfterTheOtherOnTheWayBack) {
     writeCatalogue();
     start({std::string("appID=") + doorId});

@@ -27,21 +27,7 @@ int objectsInside(const Evas_Object* object) {
 
 }  // namespace
 
-test_ui::LongUse::LongUse(const Evas_Object* window) : canvas_(evas_object_evas_get(window)) {
-    ecore_evas_manual_render_set(ecore_evas_ecore_evas_get(canvas_), EINA_TRUE);
-    beforeIdle_ = ecore_idle_enterer_add(
-        [](void* data) -> Eina_Bool {
-            auto* self = static_cast<LongUse*>(data);
-            ++self->turns_;
-            evas_norender(self->canvas_);
-            return ECORE_CALLBACK_RENEW;
-        },
-        this);
-}
-
-test_ui::LongUse::~LongUse() {
-    ecore_idle_enterer_del(beforeIdle_);
-}
+test_ui::LongUse::LongUse(Evas_Object* window) : canvas_(evas_object_evas_get(window)), undrawn_(window) {}
 
 int test_ui::LongUse::objects() const {
     int count = 0;
@@ -51,9 +37,9 @@ int test_ui::LongUse::objects() const {
 }
 
 int test_ui::LongUse::turnsInASecond() {
-    const int before = turns_;
+    const int before = undrawn_.turns();
     runFor(1.0);
-    return turns_ - before;
+    return undrawn_.turns() - before;
 }
 
 std::size_t test_ui::LongUse::memory() {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <Elementary.h>
+#include "ui/Undrawn.h"
 
 #include <cstddef>
 #include <random>
@@ -12,10 +12,7 @@ class Screen;
 /// A window in long use. Nothing is drawn meanwhile, which would take most of the time; what is left behind is counted.
 class LongUse {
 public:
-    explicit LongUse(const Evas_Object* window);
-    ~LongUse();
-    LongUse(const LongUse&) = delete;
-    LongUse& operator=(const LongUse&) = delete;
+    explicit LongUse(Evas_Object* window);
 
     /// All Evas objects of the window, also those inside others.
     int objects() const;
@@ -26,8 +23,7 @@ public:
 
 private:
     Evas* canvas_;
-    Ecore_Idle_Enterer* beforeIdle_;
-    int turns_ = 0;
+    Undrawn undrawn_;
 };
 
 /// How often to do something: the short run is part of every run of the tests, KEST_SOAK=full in the environment asks

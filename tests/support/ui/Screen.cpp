@@ -74,11 +74,12 @@ void Screen::takeFocus() {
 
 Picture Screen::picture() {
     Ecore_Evas* frame = ecore_evas_ecore_evas_get(canvas());
-    // Waits for a frame that a thread still draws, then draws what has changed since here.
+    // Waits for a frame that a thread still draws, then draws here, also what earlier frames left undrawn.
     evas_sync(canvas());
-    evas_render(canvas());
     int width = 0, height = 0;
     ecore_evas_geometry_get(frame, nullptr, nullptr, &width, &height);
+    evas_damage_rectangle_add(canvas(), 0, 0, width, height);
+    evas_render(canvas());
     return Picture(width, height, static_cast<const unsigned int*>(ecore_evas_buffer_pixels_get(frame)));
 }
 
