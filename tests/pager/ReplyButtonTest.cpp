@@ -31,6 +31,20 @@ TEST_F(ReplyButton, ShowsThatItIsPressed) {
     EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide", "0.0 area reply,press,show"));
 }
 
+TEST_F(ReplyButton, CountsASecondPressSoonAfterTheFirst) {
+    playToItsEnd();
+    screen().tap(button());
+    test_ui::runFor(0.1);
+    // As a display tells of it.
+    test_ui::inMainLoop([&] {
+        evas_event_feed_mouse_down(screen().canvas(), 1, EVAS_BUTTON_DOUBLE_CLICK,
+                                   static_cast<unsigned int>(ecore_time_get() * 1000), nullptr);
+    });
+    test_ui::runFor(0.01);
+    EXPECT_EQ(device()->usage().all().size(), 2U);
+    screen().lift();
+}
+
 TEST_F(ReplyButton, StaysHiddenWhenItIsPressedWhileTheFirstPictureIsShown) {
     play(2, {0}, 0.5);
     pressReply();

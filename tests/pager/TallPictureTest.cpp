@@ -43,6 +43,7 @@ TEST_F(TallPicture, StandsStillWhenItIs100PixelsTooHigh) {
 TEST_F(TallPicture, ThatStandsStillHasNoButtonEither) {
     play(755, 1);
     calls::forget();
+    EXPECT_STREQ(edje_object_part_state_get(elm_layout_edje_get(video()), "reply.clip", nullptr), "default");
     pressReply();
     releaseReply();
     test_ui::runFor(20);

@@ -48,6 +48,7 @@ TEST_P(TouchedPictures, GoOnToTheirStartAndPlayAgain) {
     reply();
     test_ui::runFor(20);
     EXPECT_THAT(calls::story(), Contains(EndsWith(" pictures to page 2")));
+    ASSERT_FALSE(calls::story().empty());
     EXPECT_THAT(calls::story().back(), EndsWith("area reply,show"));
 }
 
@@ -67,5 +68,6 @@ TEST_P(TouchedPictures, ThatAreTallGoOnUpAndPlayAgain) {
     reply();
     test_ui::runFor(20);
     EXPECT_THAT(calls::story(), Contains(EndsWith(" pictures to y 145")));
+    ASSERT_FALSE(calls::story().empty());
     EXPECT_THAT(calls::story().back(), EndsWith("area reply,show"));
 }

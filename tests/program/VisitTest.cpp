@@ -48,7 +48,7 @@ protected:
         }
         return "default";
     }
-    bool replyIsHidden() { return stateOf(area(), "reply.clip") == "hidden"; }
+    bool replyIsHidden() { return stateOf(area(), "reply.clip") != "shown"; }
     bool markerShows() {
         const Json picture = inSight(
             [](const Json& element) { return element.value("group", "").rfind("layout/multi_image/", 0) == 0; });

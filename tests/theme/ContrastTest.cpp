@@ -95,6 +95,7 @@ Colours applicationColours(const std::string& theme) {
 class ContrastOnAPage : public test_ui::UiTest, public testing::WithParamInterface<const char*> {
 protected:
     const Colours colours_ = applicationColours(GetParam());
+    const Colours ofTheDevice_ = GetParam() == std::string("dark") ? darkColours() : lightColours();
 };
 
 TEST_P(ContrastOnAPage, OfTheTitleTheTextAndItsLinksIsAtLeastFourAndAHalf) {
@@ -104,6 +105,10 @@ TEST_P(ContrastOnAPage, OfTheTitleTheTextAndItsLinksIsAtLeastFourAndAHalf) {
     EXPECT_GE(contrast(colours_.at("device/reading"), paper), 4.5);
     EXPECT_GE(contrast(colours_.at("device/link"), paper), 4.5);
     EXPECT_GE(contrast(colours_.at("device/link"), colours_.at("device/link/pressed")), 4.5);
+}
+
+TEST_P(ContrastOnAPage, OfTheScrollbarIsAtLeastThree) {
+    EXPECT_GE(contrast(ofTheDevice_.at("device/scrollbar"), colours_.at("kest/content/info")), 3.0);
 }
 
 TEST_P(ContrastOnAPage, OfTheReplyArrowIsAtLeastFourAndAHalf) {

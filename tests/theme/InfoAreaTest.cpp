@@ -30,6 +30,14 @@ TEST_F(InfoArea, HasTheTitleAboveTheTextWithinTheMargins) {
     EXPECT_GE(entry().y, label().y + label().height);
 }
 
+TEST_F(InfoArea, IsAPaperWithRoundedUpperCorners) {
+    show("Find", "One finger.", {.isDark = true});
+    const auto shown = screen().picture();
+    for (const int x : {0, 719})
+        EXPECT_THAT(shown.pixel(x, 768), LooksLike(0x0E1116)) << x;
+    EXPECT_EQ(shown.pixel(60, 768), paper);
+}
+
 TEST_F(InfoArea, DrawsTheIconBesideTheTitleInTheMiddle) {
     show("Find", "One finger.");
     const auto shown = screen().picture();

@@ -8,6 +8,7 @@ using testing::IsEmpty;
 
 constexpr unsigned int red = 0xC03020;
 constexpr unsigned int disc = 0x14181F;
+constexpr unsigned int arrow = 0xFFFFFF;
 constexpr unsigned int pressed = 0x064552;
 
 /// The button over a picture. Its disc is 92 pixels wide, in the lower right corner of the area; the point looked at
@@ -16,11 +17,16 @@ class ReplyButton : public PageTest {
 protected:
     static constexpr Point button{718 - 84, 767 - 84};
 
-    void show(Kind kind = {}) {
+    /// As at first, with the button away.
+    void showPictures(Kind kind = {}, unsigned int colour = red) {
         startPage(kind);
-        showSequence({picture(red), picture(0x3020C0)});
+        showSequence({picture(colour), picture(0x3020C0)});
         listen();
         test_ui::runFor(1);
+    }
+    void show(Kind kind = {}, unsigned int colour = red) {
+        showPictures(kind, colour);
+        say("reply,show");
     }
     void listen() { edje_object_signal_callback_add(elm_layout_edje_get(pictures_), "reply,*", "*", heard, this); }
 
@@ -51,9 +57,20 @@ private:
     bool answers_ = false;
 };
 
-TEST_F(ReplyButton, IsThereFromTheStart) {
-    show();
-    EXPECT_THAT(look(), LooksLike(disc));
+TEST_F(ReplyButton, IsAwayAtFirst) {
+    showPictures();
+    EXPECT_EQ(red, look());
+    screen().tap(button);
+    test_ui::runFor(0.3);
+    EXPECT_THAT(signals_, IsEmpty());
+}
+
+TEST_F(ReplyButton, HasAnArrowOnItsDiscAndALineAroundItOnADarkPicture) {
+    show({}, disc);
+    const auto shown = screen().picture();
+    EXPECT_GT(shown.count(arrow, {button.x - 30, button.y - 30, 60, 60}), 200);
+    for (const Point rim : {Point{button.x, button.y - 45}, {button.x, button.y + 44}, {button.x - 45, button.y}})
+        EXPECT_GT(shown.colours({rim.x - 2, rim.y - 2, 5, 5}), 1) << rim.x << "," << rim.y;
 }
 
 TEST_F(ReplyButton, GoesAwayAndComesBackWithoutAJump) {
@@ -206,6 +223,7 @@ private:
             height_ = 655;
             showSequence({picture(red), picture(0x3020C0)});
             listen();
+            elm_layout_signal_emit(pictures_, "reply,show", "");
         }
         return table;
     }
