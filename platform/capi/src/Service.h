@@ -39,6 +39,15 @@ int callOnDevice(const char* name, Body&& body) noexcept {
     return opened != TIZEN_ERROR_NONE ? opened : call(name, [&] { return body(device::Device::current()); });
 }
 
+/// The number of an enumerator that a C caller gave, who may give any: C++ must not read one that its type cannot have.
+template <class Enumerator>
+int numberOf(const Enumerator& enumerator) noexcept {
+    static_assert(sizeof(Enumerator) == sizeof(int));
+    int number = 0;
+    std::memcpy(&number, &enumerator, sizeof number);
+    return number;
+}
+
 /// A copy for a C caller, who frees it with free(). Throws std::bad_alloc.
 inline char* copyOf(const std::string& text) {
     auto* copy = static_cast<char*>(std::malloc(text.size() + 1));

@@ -38,6 +38,7 @@ private:
     static void onCanvasFree(void* data, Evas* canvas, void* info);
     void begin();
     void settle();
+    bool isCarriedOut() const;
     void end(const std::string& error);
     void forgetCanvas();
 
