@@ -93,7 +93,14 @@ TEST_F(OnScreen, WhatCannotBeTappedIsAnErrorThatSaysWhatThereIs) {
     EXPECT_EQ(run({"key", "Hyper"}),
               failed("unknown key \"Hyper\"; there are Up, Down, Left, Right, Return, KP_Enter, space, Tab, Escape, "
                      "Delete, Home, End, Prior, BackSpace, XF86Back, Next, back, letters and digits"));
-    EXPECT_EQ(run({"swipe", "1", "1", "2", "2", "--seconds", "11"}), failed("a swipe takes from 0.01 to 10 seconds"));
+}
+
+TEST_F(OnScreen, AnOutputThatNobodyReadsOnIsNotComplainedOf) {
+    const Result result = device_.runUnread({"tree"});
+
+    EXPECT_EQ(result.err, "");
+    // Without an error too where the reader had not yet gone.
+    EXPECT_THAT(result.status, testing::AnyOf(141, 0));
 }
 
 TEST_F(OnScreen, AKeyThatEndsTheApplicationWasPressedAllTheSame) {

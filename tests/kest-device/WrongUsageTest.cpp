@@ -43,6 +43,25 @@ TEST_F(WrongUsage, AnUnknownCondition) {
     EXPECT_EQ(run({"wait-for", "log="}), wrongUsage("there is no condition \"log=\"" + rest));
 }
 
+TEST_F(WrongUsage, RowsThatAreNoNumber) {
+    EXPECT_EQ(run({"wait-for", "rows=-1"}), wrongUsage("the condition \"rows=-1\" needs a number after its \"=\"; see "
+                                                       "'kest-device wait-for --help'"));
+}
+
+TEST_F(WrongUsage, ASwipeThatTakesNoTimeOrForEver) {
+    for (const char* seconds : {"0", "11", "-1", "nan"}) {
+        EXPECT_EQ(run({"swipe", "1", "1", "2", "2", "--seconds", seconds}),
+                  wrongUsage("a swipe takes from 0.01 to 10 seconds; see 'kest-device swipe --help'"))
+            << seconds;
+    }
+}
+
+TEST_F(WrongUsage, FilesWithoutAName) {
+    EXPECT_EQ(run({"install", ""}), wrongUsage("the package's folder has no name; see 'kest-device install --help'"));
+    EXPECT_EQ(run({"screenshot", ""}),
+              wrongUsage("the picture's file has no name; see 'kest-device screenshot --help'"));
+}
+
 TEST_F(WrongUsage, AnUnknownLevel) {
     EXPECT_EQ(run({"log", "--level", "loud"}),
               wrongUsage("there is no level \"loud\"; there are debug, info, warning, error and fatal; see "

@@ -108,16 +108,6 @@ TEST_F(Actions, WhatIsUnderWayAtTheEndIsAnsweredWithAnError) {
     EXPECT_EQ(results_.size(), 2U);
 }
 
-TEST_F(Actions, WhoseLastStepIsTheEndAreAnsweredWell) {
-    ask([this](Evas*) {
-        return std::vector<remote_control::Playback::Step>{{0, [] {}}, {0.1, [this] { queue_.reset(); }}};
-    });
-    askForTap(1, 1);
-    ASSERT_TRUE(test_ui::runUntil([this] { return results_.size() == 2; }));
-
-    EXPECT_THAT(results_, ElementsAre("", "the application closed its window before the request was carried out"));
-}
-
 TEST_F(Actions, WhatHasOnlyToSettleAtTheEndIsAnsweredWell) {
     askForTap(row(1).x, row(1).y);
     ASSERT_TRUE(test_ui::runUntil([this] { return sample_->choices() == 1; }));

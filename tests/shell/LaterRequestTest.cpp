@@ -129,6 +129,14 @@ TEST_F(LaterRequest, ToAnEmptyScreenLeavesNothingToGoBackTo) {
     EXPECT_TRUE(test_ui::hasEnded());
 }
 
+TEST_F(LaterRequest, IsNotWaitedForByAnEmptyScreenThatIsLeft) {
+    writeCatalogue();
+    start({"appID=com.example.none"});
+    EXPECT_FALSE(test_ui::hasEnded());
+    screen().key("XF86Back");
+    EXPECT_TRUE(test_ui::hasEnded());
+}
+
 TEST_F(LaterRequest, OpensTheTipAnewWhenThePagerWasClosed) {
     writeCatalogue();
     start({std::string("appID=") + clockId});

@@ -4,8 +4,12 @@
 #include "commands/Commands.h"
 #include "device/Error.h"
 
+#include <csignal>
 #include <iostream>
 #include <string>
+
+#include <poll.h>
+#include <unistd.h>
 
 namespace {
 
@@ -84,6 +88,16 @@ std::string mistake(const CLI::App& app, const CLI::ParseError& error, int argc,
     return argc > 1 ? error.what() : "a command is missing";
 }
 
+/// Ends as a command does whose output nobody reads on, as in `kest-device tree | head`. The bus's library has the
+/// process go on in that case.
+void endWithItsReader() {
+    pollfd output{STDOUT_FILENO, POLLOUT, 0};
+    if (poll(&output, 1, 0) == 1 && (output.revents & POLLERR) != 0) {
+        std::signal(SIGPIPE, SIG_DFL);
+        std::raise(SIGPIPE);
+    }
+}
+
 /// The command whose help explains the mistake.
 std::string helpCommand(const CLI::App& app) {
     const auto commands = app.get_subcommands();
@@ -109,6 +123,7 @@ int run(int argc, char** argv) {
         return sayError(std::string(error.what()) + "; see '" + helpCommand(app) + "'", wrongUsage);
     }
     if (!std::cout.flush()) {
+        endWithItsReader();
         return sayError("cannot write the output; is the disk full?", failed);
     }
     return 0;

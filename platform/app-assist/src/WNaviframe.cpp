@@ -181,8 +181,12 @@ void WNaviframe::announceTop() {
 }
 
 void WNaviframe::back() {
-    if (naviframe_)
+    if (!naviframe_)
+        return;
+    if (elm_naviframe_top_item_get(naviframe_))
         elm_naviframe_item_pop(naviframe_);
+    else
+        elm_exit();
 }
 
 WView* WNaviframe::viewOf(const Elm_Object_Item* item) const {

@@ -12,7 +12,7 @@ constexpr char closed[] = "the application closed its window before the request 
 }  // namespace
 
 ActionQueue::~ActionQueue() {
-    const bool carriedOut = isCarriedOut();
+    const bool carriedOut = settling_ != nullptr;
     forgetCanvas();
     playback_.reset();
     settling_.reset();
@@ -65,10 +65,6 @@ void ActionQueue::end(const std::string& error) {
     }
 }
 
-bool ActionQueue::isCarriedOut() const {
-    return settling_ || (playback_ && playback_->isOver());
-}
-
 void ActionQueue::forgetCanvas() {
     if (canvas_) {
         evas_event_callback_del_full(canvas_, EVAS_CALLBACK_FREE, onCanvasFree, this);
@@ -78,7 +74,7 @@ void ActionQueue::forgetCanvas() {
 
 void ActionQueue::onCanvasFree(void* data, Evas*, void*) {
     auto* self = static_cast<ActionQueue*>(data);
-    guarded([self] { self->end(self->isCarriedOut() ? "" : closed); });
+    guarded([self] { self->end(self->settling_ ? "" : closed); });
 }
 
 }  // namespace remote_control

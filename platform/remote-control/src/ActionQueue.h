@@ -38,7 +38,6 @@ private:
     static void onCanvasFree(void* data, Evas* canvas, void* info);
     void begin();
     void settle();
-    bool isCarriedOut() const;
     void end(const std::string& error);
     void forgetCanvas();
 

@@ -22,9 +22,6 @@ public:
     Playback(const Playback&) = delete;
     Playback& operator=(const Playback&) = delete;
 
-    /// Whether the last step has begun, which may close the window before it is said that all is done.
-    bool isOver() const { return next_ == steps_.size(); }
-
 private:
     static Eina_Bool onTimer(void* data);
     void waitForNext();

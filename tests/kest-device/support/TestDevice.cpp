@@ -181,6 +181,14 @@ Result TestDevice::runCommand(const std::vector<std::string>& command) {
     return result;
 }
 
+Result TestDevice::runUnread(const std::vector<std::string>& words) {
+    std::vector<std::string> command{"bash", "-c", R"(set -o pipefail; "$@" | true)", "bash"};
+    for (const std::string& word : kestDevice(words)) {
+        command.push_back(word);
+    }
+    return runCommand(command);
+}
+
 std::string TestDevice::must(const std::vector<std::string>& words) {
     const Result result = run(words);
     EXPECT_EQ(result.status, 0) << words.front() << ": " << result.err;

@@ -42,6 +42,18 @@ struct Options {
     std::string appId;
 };
 
+/// Whether the application is about to end or has: it leaves the bus at once, and may then take a while.
+bool ends(Session& session, const RunningApplication& application) {
+    const auto deadline = std::chrono::steady_clock::now() + 1s;
+    do {
+        const std::optional<RunningApplication> stillThere = findApplication(session, application.id);
+        if (!stillThere || !stillThere->onBus) {
+            return application.process.endsWithin(20s);
+        }
+    } while (!application.process.endsWithin(20ms) && std::chrono::steady_clock::now() < deadline);
+    return !application.process.runs();
+}
+
 /// Input that ends the application was carried out all the same.
 void send(Session& session, const std::string& appId, const std::string& method,
           const device::BusCall::Arguments& arguments) {
@@ -49,7 +61,7 @@ void send(Session& session, const std::string& appId, const std::string& method,
     try {
         callTo(session, application.id).call(method, arguments);
     } catch (const device::Error&) {
-        if (!application.process.endsWithin(1s)) {
+        if (!ends(session, application)) {
             throw;
         }
         std::cout << application.id << " ended\n";
@@ -94,6 +106,9 @@ void addSwipe(CLI::App& app, Session& session) {
     addAppOption(*command, options->appId);
     command->footer(swipeAbout);
     command->callback([options, &session] {
+        if (!(options->seconds >= 0.01 && options->seconds <= 10)) {
+            throw UsageError("a swipe takes from 0.01 to 10 seconds");
+        }
         const std::array<int, 4>& at = options->places;
         send(session, options->appId, "Swipe", {at[0], at[1], at[2], at[3], options->seconds});
     });

@@ -94,7 +94,12 @@ void addInstall(CLI::App& app, Session& session) {
     const auto source = std::make_shared<std::string>();
     command->add_option("dir", *source, "The package's folder")->type_name("DIR")->required();
     command->footer(installAbout);
-    command->callback([source, &session] { install(session, *source); });
+    command->callback([source, &session] {
+        if (source->empty()) {
+            throw UsageError("the package's folder has no name");
+        }
+        install(session, *source);
+    });
 }
 
 void addUninstall(CLI::App& app, Session& session) {

@@ -28,6 +28,9 @@ void addScreenshot(CLI::App& app, Session& session) {
     addAppOption(*command, options->appId);
     command->footer(about);
     command->callback([options, &session] {
+        if (options->file.empty()) {
+            throw UsageError("the picture's file has no name");
+        }
         const std::string id = theApplication(session, options->appId).id;
         callTo(session, id).call("Screenshot", {std::filesystem::absolute(options->file).lexically_normal().string()});
     });

@@ -14,7 +14,7 @@ class BackKeys;
 class WView;
 
 /// A stack of views of which the top one shows. Owns the views that were pushed.
-/// The device's back key pops the top view, wherever the focus is; on the last view it ends the application.
+/// The device's back key pops the top view, wherever the focus is; on the last, or without one, it ends the program.
 class WNaviframe : public WUIObject {
 public:
     WNaviframe();
