@@ -46,6 +46,40 @@ TEST_F(PageMovement, ATurnedPageStartsAndStopsOnce) {
     EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
 }
 
+TEST_F(PageMovement, AFlickOfAThirdOfTheScreenTurnsThePage) {
+    listenTo(1);
+    for (const double seconds : {0.1, 0.2, 0.3}) {
+        screen().swipe({600, 700}, {360, 700}, seconds);
+        test_ui::runFor(2.0);
+        EXPECT_THAT(heard(), ElementsAre("start", "stop 2")) << seconds;
+        screen().swipe({120, 700}, {360, 700}, seconds);
+        test_ui::runFor(2.0);
+        EXPECT_THAT(heard(), ElementsAre("start", "stop 1")) << seconds;
+    }
+}
+
+TEST_F(PageMovement, AShortWayOrASlowOneOfLessThanHalfTheScreenSpringsBack) {
+    listenTo(1);
+    screen().swipe({600, 700}, {540, 700}, 0.2);
+    test_ui::runFor(2.0);
+    EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
+    screen().swipe({600, 700}, {300, 700}, 2);
+    test_ui::runFor(2.0);
+    EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
+}
+
+TEST_F(PageMovement, AFingerThatTurnsRoundTurnsNoPage) {
+    listenTo(1);
+    screen().press({600, 700});
+    for (const int x : {560, 480, 400, 320, 240, 180, 240, 320, 400}) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 700});
+    }
+    screen().lift();
+    test_ui::runFor(2.0);
+    EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
+}
+
 TEST_F(PageMovement, ASlowTurnStartsAndStopsOnce) {
     listenTo(1);
     screen().swipe({700, 700}, {100, 700}, 1.5);

@@ -123,7 +123,8 @@ TEST_F(Swipe, StopsThePagesInTheirOrder) {
     swipe();
     EXPECT_THAT(calls::wholeStory(), ElementsAre("0.2 page 0: pictures at page 0", "0.2 page 0: picture 0 touch,hide",
                                                  "0.2 page 1: pictures at page 0", "0.2 page 1: picture 0 touch,hide",
-                                                 "0.2 page 2: pictures at page 0", "0.2 page 2: picture 0 touch,hide"));
+                                                 "0.2 page 2: pictures at page 0", "0.2 page 2: picture 0 touch,hide",
+                                                 "0.2 page -1: pages to page 2"));
 }
 
 TEST_F(Swipe, PlaysThePageThatItComesTo) {

@@ -6,7 +6,7 @@
 
 namespace app_assist {
 
-void BounceGuard::attach(Evas_Object* scroller) {
+BounceGuard& BounceGuard::attach(Evas_Object* scroller) {
     std::unique_ptr<BounceGuard> guard(new BounceGuard(scroller));
     const auto onSmart = [&](const char* event, Evas_Smart_Cb callback) {
         evas_object_smart_callback_priority_add(scroller, event, EVAS_CALLBACK_PRIORITY_BEFORE, callback, guard.get());
@@ -25,7 +25,7 @@ void BounceGuard::attach(Evas_Object* scroller) {
             ecore_job_del(self->job_);
     });
     // The scroller has it from now on.
-    static_cast<void>(guard.release());
+    return *guard.release();
 }
 
 void BounceGuard::hush() const {
@@ -33,14 +33,24 @@ void BounceGuard::hush() const {
     efl_event_callback_stop(scroller_);
 }
 
+void BounceGuard::redirect(const std::function<void()>& change) {
+    redirects_ = moving_;
+    change();
+    redirects_ = false;
+}
+
 void BounceGuard::started() {
-    if (going_)
+    if (going_ || redirects_)
         hush();
     else
         moving_ = true;
 }
 
 void BounceGuard::stopped() {
+    if (redirects_) {
+        hush();
+        return;
+    }
     if (moving_ && !going_) {
         moving_ = false;
         return;

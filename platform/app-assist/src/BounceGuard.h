@@ -2,6 +2,8 @@
 
 #include <Elementary.h>
 
+#include <functional>
+
 namespace app_assist {
 
 /// Pairs a scroller's "scroll,anim,start" and "scroll,anim,stop": each movement ends once. EFL goes on to animate a
@@ -11,7 +13,10 @@ namespace app_assist {
 class BounceGuard {
 public:
     /// For as long as the scroller lives. To be called before others listen to the scroller.
-    static void attach(Evas_Object* scroller);
+    static BounceGuard& attach(Evas_Object* scroller);
+
+    /// Runs what gives a movement another end; a movement that is under way stays the same one.
+    void redirect(const std::function<void()>& change);
 
 private:
     explicit BounceGuard(Evas_Object* scroller) : scroller_(scroller) {}
@@ -23,6 +28,7 @@ private:
     Evas_Object* scroller_;
     Ecore_Job* job_ = nullptr;
     bool moving_ = false;
+    bool redirects_ = false;
     bool going_ = false;
 };
 

@@ -2,6 +2,7 @@
 
 #include "BounceGuard.h"
 #include "Guarded.h"
+#include "PageFinger.h"
 #include "app-assist/WUiTimer.h"
 
 #include <algorithm>
@@ -24,7 +25,7 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
         return nullptr;
     evas_object_size_hint_weight_set(scroller_, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
     evas_object_size_hint_align_set(scroller_, EVAS_HINT_FILL, EVAS_HINT_FILL);
-    BounceGuard::attach(scroller_);
+    PageFinger::attach(scroller_, BounceGuard::attach(scroller_));
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
     evas_object_smart_callback_add(
         scroller_, "scroll,page,changed",
