@@ -68,6 +68,19 @@ TEST_F(PageMovement, AShortWayOrASlowOneOfLessThanHalfTheScreenSpringsBack) {
     EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
 }
 
+TEST_F(PageMovement, AFingerThatRestsBeforeItIsLiftedTurnsNoPage) {
+    listenTo(1);
+    screen().press({600, 700});
+    for (const int x : {560, 500, 440, 380}) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 700});
+    }
+    test_ui::runFor(0.5);
+    screen().lift();
+    test_ui::runFor(2.0);
+    EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
+}
+
 TEST_F(PageMovement, AFingerThatTurnsRoundTurnsNoPage) {
     listenTo(1);
     screen().press({600, 700});

@@ -1,5 +1,7 @@
 #include "ListTest.h"
 
+#include "ui/Transitions.h"
+
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -24,12 +26,9 @@ TEST_F(Tap, OnTheFirstMenuOpensThePagerAtIt) {
 TEST_F(Tap, SlidesThePagerIn) {
     writeTips({"A"});
     start();
-    int finished = 0;
-    evas_object_smart_callback_add(
-        naviframe().getEvasObj(), "transition,finished",
-        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    const test_ui::Transitions transitions(naviframe().getEvasObj());
     openPager();
-    EXPECT_EQ(finished, 1);
+    EXPECT_EQ(transitions.finished(), 1);
 }
 
 TEST_F(Tap, OnALaterMenuOpensThePagerAtThatOne) {

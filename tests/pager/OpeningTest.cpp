@@ -1,5 +1,7 @@
 #include "PagerTest.h"
 
+#include "ui/Transitions.h"
+
 #include "KestMainView.h"
 
 #include <utility>
@@ -34,12 +36,9 @@ protected:
     }
     /// How many transitions of the naviframe come to their end within a second.
     int transitions() {
-        int count = 0;
-        const auto finished = [](void* data, Evas_Object*, void*) { ++*static_cast<int*>(data); };
-        evas_object_smart_callback_add(naviframe().getEvasObj(), "transition,finished", finished, &count);
+        const test_ui::Transitions transitions(naviframe().getEvasObj());
         test_ui::runFor(1);
-        evas_object_smart_callback_del(naviframe().getEvasObj(), "transition,finished", finished);
-        return count;
+        return transitions.finished();
     }
 };
 

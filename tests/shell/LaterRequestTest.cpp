@@ -1,5 +1,7 @@
 #include "RequestTest.h"
 
+#include "ui/Transitions.h"
+
 #include "KestContentMgr.h"
 
 #include <device/Keys.h>
@@ -110,15 +112,12 @@ TEST_F(LaterRequest, HasItsPageKeepItsNumberWhenTheThemeChanges) {
 TEST_F(LaterRequest, HasNoTransition) {
     writeCatalogue();
     start();
-    int finished = 0;
-    evas_object_smart_callback_add(
-        naviframe().getEvasObj(), "transition,finished",
-        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    const test_ui::Transitions transitions(naviframe().getEvasObj());
     request({{"appID", clockId}});
-    EXPECT_EQ(finished, 0);
+    EXPECT_EQ(transitions.finished(), 0);
     naviframe().back();
     settle();
-    EXPECT_EQ(finished, 1) << "this one has";
+    EXPECT_EQ(transitions.finished(), 1) << "this one has";
 }
 
 TEST_F(LaterRequest, ToAnEmptyScreenLeavesNothingToGoBackTo) {

@@ -1,5 +1,7 @@
 #include "RequestTest.h"
 
+#include "ui/Transitions.h"
+
 #include <app-assist/WWindow.h>
 
 #include <algorithm>
@@ -168,13 +170,10 @@ TEST_F(RequestTest, OpensAllTipsOfTheApplicationFromThatPageOnOverOneList) {
 TEST_F(RequestTest, SlidesFurtherPagersInOverTheFirst) {
     writeCatalogue();
     startWithoutView();
-    int finished = 0;
-    evas_object_smart_callback_add(
-        naviframe().getEvasObj(), "transition,finished",
-        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &finished);
+    const test_ui::Transitions transitions(naviframe().getEvasObj());
     test_ui::inMainLoop([&] { requestAtOnce({{"appID", doorId}, {"page", "2"}}, true); });
     settle();
-    EXPECT_EQ(finished, 1);
+    EXPECT_EQ(transitions.finished(), 1);
 }
 
 TEST_F(RequestTest, OpensThemOneAfterTheOtherOnTheWayBack) {

@@ -12,7 +12,7 @@ namespace app_assist {
 /// anything of a scroller that goes.
 class BounceGuard {
 public:
-    /// For as long as the scroller lives. To be called before others listen to the scroller.
+    /// For as long as the scroller lives, whose it is. To be called before others listen to the scroller.
     static BounceGuard& attach(Evas_Object* scroller);
 
     /// Runs what gives a movement another end; a movement that is under way stays the same one.

@@ -1,5 +1,7 @@
 #include "PageFinger.h"
 
+#include "Guarded.h"
+
 #include <cstdlib>
 #include <memory>
 
@@ -7,9 +9,9 @@ namespace app_assist {
 
 namespace {
 
-/// What is looked at for the speed.
+/// In seconds: what is looked at for the speed.
 constexpr double lately = 0.1;
-/// In widths of the page.
+/// In widths of the page, and those a second.
 constexpr double farWay = 0.5;
 constexpr double flickSpeed = 0.8;
 constexpr double flickWay = 0.1;
@@ -21,18 +23,18 @@ void PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
     const auto onEvas = [&](Evas_Callback_Type event, Evas_Object_Event_Cb callback) {
         evas_object_event_callback_add(scroller, event, callback, finger.get());
     };
-    onEvas(EVAS_CALLBACK_MOUSE_DOWN, [](void* data, Evas*, Evas_Object*, void* event) {
-        auto* self = static_cast<PageFinger*>(data);
+    onEvas(EVAS_CALLBACK_MOUSE_DOWN, [](void* self, Evas*, Evas_Object*, void* event) {
         const auto* down = static_cast<Evas_Event_Mouse_Down*>(event);
-        self->began_ = {down->timestamp / 1000.0, down->canvas.x};
-        self->lately_ = {self->began_};
+        static_cast<PageFinger*>(self)->touched({down->timestamp / 1000.0, down->canvas.x});
     });
-    onEvas(EVAS_CALLBACK_MOUSE_MOVE, [](void* data, Evas*, Evas_Object*, void* event) {
-        auto* self = static_cast<PageFinger*>(data);
+    onEvas(EVAS_CALLBACK_MOUSE_MOVE, [](void* self, Evas*, Evas_Object*, void* event) {
         const auto* move = static_cast<Evas_Event_Mouse_Move*>(event);
-        self->lately_.push_back({move->timestamp / 1000.0, move->cur.canvas.x});
-        while (self->lately_.back().time - self->lately_.front().time > lately && self->lately_.size() > 2)
-            self->lately_.pop_front();
+        static_cast<PageFinger*>(self)->moved({move->timestamp / 1000.0, move->cur.canvas.x});
+    });
+    // A finger that rested before it was lifted did not flick.
+    onEvas(EVAS_CALLBACK_MOUSE_UP, [](void* self, Evas*, Evas_Object*, void* event) {
+        const auto* up = static_cast<Evas_Event_Mouse_Up*>(event);
+        static_cast<PageFinger*>(self)->moved({up->timestamp / 1000.0, up->canvas.x});
     });
     onEvas(EVAS_CALLBACK_FREE, [](void* data, Evas*, Evas_Object*, void*) {
         const std::unique_ptr<PageFinger> self(static_cast<PageFinger*>(data));
@@ -43,19 +45,30 @@ void PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
         scroller, "scroll,drag,start",
         [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->dragged(); }, finger.get());
     evas_object_smart_callback_add(
-        scroller, "scroll,drag,stop", [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->lifted(); },
+        scroller, "scroll,drag,stop", [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->letGo(); },
         finger.get());
     // The scroller has it from now on.
     static_cast<void>(finger.release());
+}
+
+void PageFinger::touched(Place place) {
+    began_ = place.x;
+    lately_.clear();
+    moved(place);
+}
+
+void PageFinger::moved(Place place) {
+    guarded("a finger on the pages", [&] { lately_.push_back(place); });
+    while (lately_.size() > 2 && lately_.back().time - lately_.front().time > lately)
+        lately_.pop_front();
 }
 
 void PageFinger::dragged() {
     elm_scroller_current_page_get(scroller_, &page_, nullptr);
 }
 
-void PageFinger::lifted() {
-    pages_ = pagesToTurn();
-    // Not at once: EFL goes on to decide which page comes.
+void PageFinger::letGo() {
+    // Not at once: EFL goes on to decide which page comes, and the finger's last place is told after this.
     if (!job_)
         job_ = ecore_job_add([](void* self) { static_cast<PageFinger*>(self)->turn(); }, this);
 }
@@ -64,8 +77,9 @@ void PageFinger::turn() {
     job_ = nullptr;
     int last = 0;
     elm_scroller_last_page_get(scroller_, &last, nullptr);
-    const int page = page_ + pages_;
-    if (pages_ != 0 && page >= 0 && page <= last)
+    const int pages = pagesToTurn();
+    const int page = page_ + pages;
+    if (pages != 0 && page >= 0 && page <= last)
         guard_.redirect([&] { elm_scroller_page_bring_in(scroller_, page, 0); });
 }
 
@@ -74,12 +88,12 @@ int PageFinger::pagesToTurn() const {
     elm_scroller_region_get(scroller_, nullptr, nullptr, &width, nullptr);
     if (width <= 0 || lately_.empty())
         return 0;
-    const double way = static_cast<double>(lately_.back().x - began_.x) / width;
+    const double way = static_cast<double>(lately_.back().x - began_) / width;
     const double time = lately_.back().time - lately_.front().time;
     const double speed = time > 0 ? (lately_.back().x - lately_.front().x) / time / width : 0;
-    const bool isFlick = std::abs(speed) >= flickSpeed && std::abs(way) >= flickWay && (speed > 0) == (way > 0);
-    const bool isFar = std::abs(way) >= farWay && !(std::abs(speed) >= flickSpeed && (speed > 0) != (way > 0));
-    if (!isFlick && !isFar)
+    const bool turns =
+        std::abs(speed) >= flickSpeed ? std::abs(way) >= flickWay && (speed > 0) == (way > 0) : std::abs(way) >= farWay;
+    if (!turns)
         return 0;
     const int forth = elm_object_mirrored_get(scroller_) ? 1 : -1;
     return way > 0 ? forth : -forth;

@@ -21,18 +21,19 @@ private:
     };
 
     PageFinger(Evas_Object* scroller, BounceGuard& guard) : scroller_(scroller), guard_(guard) {}
+    void touched(Place place);
+    void moved(Place place);
     void dragged();
-    void lifted();
+    void letGo();
     void turn();
     int pagesToTurn() const;
 
     Evas_Object* scroller_;
     BounceGuard& guard_;
     /// Of the touch that is on or was the last: where it began, and where it was of late.
-    Place began_{0, 0};
+    int began_ = 0;
     std::deque<Place> lately_;
     int page_ = 0;  ///< in view when the dragging began
-    int pages_ = 0;
     Ecore_Job* job_ = nullptr;
 };
 

@@ -6,7 +6,6 @@
 #include "ui/Clock.h"
 #include "ui/Screen.h"
 
-#include <Ecore_Evas.h>
 #include <Eo.h>
 #include <cstdlib>
 #include <malloc.h>

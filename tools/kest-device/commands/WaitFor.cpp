@@ -110,9 +110,9 @@ Look look(Session& session, const Options& options, Clock::time_point deadline) 
     return lookAtScreen(session, options, deadline);
 }
 
-/// Of rows there is a number.
-void requireNumber(const std::string& condition, std::size_t begin) {
-    if (condition.rfind("rows=", 0) == 0 && condition.find_first_not_of("0123456789", begin) != std::string::npos) {
+/// Conditions of another kind are right as they are.
+void requireNumberOfRows(const std::string& condition, const std::string& value) {
+    if (condition.rfind("rows=", 0) == 0 && value.find_first_not_of("0123456789") != std::string::npos) {
         throw UsageError("the condition \"" + condition + "\" needs a number after its \"=\"");
     }
 }
@@ -124,7 +124,7 @@ void requireKnown(const std::string& condition) {
     }
     for (const char* kind : {"text", "no-text", "view", "rows", "log", "usage"}) {
         if (equals != std::string::npos && condition.substr(0, equals) == kind && equals + 1 < condition.size()) {
-            requireNumber(condition, equals + 1);
+            requireNumberOfRows(condition, condition.substr(equals + 1));
             return;
         }
     }
