@@ -47,6 +47,31 @@ TEST_F(MirroredPager, OpensOnTheChosenPageAndHasTheFirstAtTheRight) {
     }
 }
 
+TEST_F(MirroredPager, TurnsByAFlickOfAThirdOfTheScreen) {
+    listenTo(1);
+    screen().swipe({120, 700}, {360, 700}, 0.2);
+    test_ui::runFor(2.0);
+    EXPECT_THAT(movements_.heard(), ElementsAre("start", "stop 2"));
+    screen().swipe({600, 700}, {360, 700}, 0.2);
+    test_ui::runFor(2.0);
+    EXPECT_THAT(movements_.heard(), ElementsAre("start", "stop 1"));
+    expectInView(1);
+}
+
+TEST_F(MirroredPager, KeepsThePageThatIsShownUnderAFinger) {
+    listenTo(1);
+    screen().press({100, 700});
+    for (const int x : {150, 200, 250, 300, 350, 400}) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 700});
+        if (x == 250)
+            pager_->showPage(4, false);
+    }
+    screen().lift();
+    test_ui::runFor(2.0);
+    expectInView(4);
+}
+
 TEST_F(MirroredPager, TurnsToTheNextPageByASwipeToTheRight) {
     listenTo(0);
     for (const int page : {1, 2, 3, 4}) {

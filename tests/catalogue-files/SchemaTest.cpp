@@ -120,6 +120,7 @@ const Mistake menuMistakes[] = {
     {"PathHasABlank", "contents/a.xml", "contents/a b.xml", badText("menu.xml", 4, "path")},
     {"PathIsEmpty", "contents/a.xml", "", badText("menu.xml", 4, "path")},
     {"AppidIsEmpty", "com.ravella.clock", "", badText("menu.xml", 5, "appid")},
+    {"AppidHasXmlInIt", "com.ravella.clock", "com.xmlviewer", badText("menu.xml", 5, "appid")},
     {"AppidIsNoBusName", "com.ravella.clock", "clock", badText("menu.xml", 5, "appid")},
     {"StateIsEmpty", "Global,India", "", badState(6)},
     {"StateHasAnUnknownRegion", "Global,India", "Global,Indian", badState(6)},

@@ -52,6 +52,22 @@ TEST_F(Cache, IsWrittenFieldByFieldAfterEachTip) {
                                      Pair("KestPackageVersion", "1.0.0")));
 }
 
+TEST_F(Cache, GetsNoVersionAtTheEndWhereThePackageHasNone) {
+    writeTip("<title>A</title>");
+    upgradeTo("");
+    written.clear();
+    load();
+    EXPECT_EQ(std::ranges::count(written, "KestPackageVersion", [](const auto& entry) { return entry.first; }), 1)
+        << "the empty one at the beginning";
+}
+
+TEST_F(Cache, GetsTheVersionThatThePackageHasAtTheEnd) {
+    writeTip("<title>A</title>");
+    meanwhile["contents_tip.xml_launchParamValue"] = [this] { upgradeTo("3.0.0"); };
+    load();
+    EXPECT_EQ(preference("KestPackageVersion"), "3.0.0");
+}
+
 TEST_F(Cache, HoldsEmptyFieldsToo) {
     loadTip("<title>Title</title>");
     EXPECT_EQ(preference("contents_tip.xml_appName"), "");

@@ -24,6 +24,15 @@ TEST_F(Cache, IsNotUsedWhenALoadIsForced) {
     EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Version changed!!"))));
 }
 
+TEST_F(Cache, IsNotAskedWhetherItIsValidWhenALoadIsForced) {
+    fill();
+    setLanguage("ko_KR.UTF-8");
+    asked.clear();
+    load(true);
+    EXPECT_THAT(asked, testing::IsEmpty());
+    EXPECT_THAT(log(), Not(Contains(info("__checkCacheAvailable", "Language changed"))));
+}
+
 TEST_F(Cache, IsInvalidWithoutALineWhenItHasNoLanguage) {
     writeTip("<title>A</title>");
     device()->preferences().clear(kest);

@@ -1,5 +1,7 @@
 #include "CatalogueTest.h"
 
+#include <regex>
+
 using namespace manager_log;
 using kest_files::contents;
 using kest_files::textTag;
@@ -51,6 +53,20 @@ TEST_F(StringFile, IsNamedByTheFirstXmlOfThePath) {
     writeMenus({menu});
     writeDetail("<title id=\"IDS_MINE\">untranslated</title>", menu.path);
     writeStrings({{"en_US", "IDS_MINE", "Mine"}}, "contents/tip-string.xml.d/tip.xml");
+    EXPECT_EQ(load().at(0).menuTitle, "Mine");
+}
+
+TEST_F(StringFile, IsNamedByTheFirstXmlOfTheFolderToo) {
+    const std::string appid = "com.example.xmlviewer";
+    addApplication(appid);
+    writeMenus({{"contents/tip.xml", appid}});
+    writeDetail("<title id=\"IDS_MINE\">untranslated</title>", "contents/tip.xml", appid);
+    writeStrings({{"en_US", "IDS_MINE", "Mine"}}, "contents/any.xml", appid);
+    // As the rule has it, be it a folder where nobody would look.
+    const std::filesystem::path shifted =
+        std::regex_replace(resources(appid).string(), std::regex("\\.xml"), "-string.xml");
+    std::filesystem::create_directories(shifted / "contents");
+    std::filesystem::rename(resources(appid) / "contents/any.xml", shifted / "contents/tip.xml");
     EXPECT_EQ(load().at(0).menuTitle, "Mine");
 }
 

@@ -59,6 +59,15 @@ TEST_P(Interruption, ByASwipePutsThePicturesBackAndStopsThem) {
     EXPECT_EQ(pictureInView(), 0);
 }
 
+TEST_P(Interruption, ByASwipeIsNoLineOfThePageThatGoes) {
+    play();
+    newLog();
+    swipe();
+    test_ui::runFor(0.05);
+    EXPECT_EQ(calls::story().back(), "0.2 picture 1 touch,hide");
+    EXPECT_THAT(newLog(), ElementsAre(kest_log::hit(pager_log::file, "__pageScrollStartCb")));
+}
+
 TEST_P(Interruption, ByASwipeGivesTheButtonBack) {
     play();
     swipe();
@@ -115,6 +124,35 @@ TEST_P(Interruption, ByAChangeOfTheThemeStartsOver) {
     device()->settings().set(device::keys::theme, "dark");
     test_ui::runFor(0.9);
     EXPECT_THAT(calls::story(), testing::ElementsAreArray(beginning()));
+}
+
+class PageAskedForUnderAFinger : public PagerTest {};
+
+TEST_F(PageAskedForUnderAFinger, PlaysWhenTheFingerIsLifted) {
+    drawSequence(3, {0, 1});
+    drawPicture("plain.png");
+    writeTips({tip("plain.png"), tip("plain.png"), tip("a_01.png")});
+    open();
+    test_ui::runFor(1);
+    screen().press({600, 400});
+    for (int x = 550; x >= 150; x -= 50) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 400});
+        if (x == 400)
+            test_ui::inMainLoop([this] { pager().showContentsPage(2); });
+    }
+    screen().lift();
+    test_ui::runFor(0.9);
+    EXPECT_EQ(pageInView(), 2);
+    calls::forget();
+    test_ui::runFor(20);
+    EXPECT_EQ(pageInView(), 2);
+    std::vector<std::string> lines = calls::story(2);
+    for (std::string& line : lines)
+        line = line.substr(line.find(' ') + 1);
+    EXPECT_THAT(lines,
+                ElementsAre("picture 0 touch,show", "pictures to page 1", "picture 1 touch,show", "pictures to page 2",
+                            "pictures to page 0", "picture 0 touch,hide", "picture 1 touch,hide", "area reply,show"));
 }
 
 class InterruptedTallPicture : public PagerTest {

@@ -51,6 +51,26 @@ TEST_F(Preparation, FillsTheOthersAfterFourTenthsOfASecond) {
     EXPECT_THAT(newLog(), Contains(loadsOthers()));
 }
 
+TEST_F(Preparation, FillsOneOfTheOthersAtATime) {
+    open(1);
+    std::vector<long> counts;
+    std::function<void()> look = [&] {
+        const std::vector<bool> pages = filled();
+        const long count = std::count(pages.begin(), pages.end(), true);
+        if (counts.empty() || counts.back() != count)
+            counts.push_back(count);
+    };
+    Ecore_Idler* idler = ecore_idler_add(
+        [](void* each) -> Eina_Bool {
+            (*static_cast<std::function<void()>*>(each))();
+            return ECORE_CALLBACK_RENEW;
+        },
+        &look);
+    test_ui::runFor(0.5);
+    ecore_idler_del(idler);
+    EXPECT_THAT(counts, ElementsAre(1, 2, 3));
+}
+
 TEST_F(Preparation, ShowsThePageThatItFills) {
     push(0, true, [this](Pager&) { evas_object_hide(page(1)); });
     test_ui::runFor(0.35);

@@ -90,7 +90,10 @@ TEST_F(StartedByTheBus, RefusesALinkWithWhatIsNoApplicationOrNoNumberOfATip) {
     EXPECT_EQ(
         ask(desktopInterface, "Open", {BusClient::list({"kest:!!!?page=1"}), noData_}),
         "com.ravella.device.Error.Failed: cannot open \"kest:!!!?page=1\": its \"appID\" is \"!!!\", which does not "
-        "match [A-Za-z_][A-Za-z0-9_-]*(\\.[A-Za-z0-9_-]+)+; such a link is written kest:{appID}{?page}");
+        "match [A-Za-z_-][A-Za-z0-9_-]*(\\.[A-Za-z_-][A-Za-z0-9_-]*)+; such a link is written kest:{appID}{?page}");
+    EXPECT_THAT(ask(desktopInterface, "Open", {BusClient::list({"kest:com.7up"}), noData_}),
+                testing::HasSubstr("its \"appID\" is \"com.7up\", which does not match"))
+        << "no application can have that name on the bus";
     EXPECT_THAT(views(), IsEmpty());
     EXPECT_THAT(records(), IsEmpty());
 }

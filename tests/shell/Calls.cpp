@@ -86,8 +86,14 @@ WUiTimer::Handle addAndNoteIdler(WUiTimer::Function function, app_assist::WView*
                                  Evas_Object* owner) __asm__("__wrap_" ADD_IDLER);
 
 WUiTimer::Handle addAndNoteIdler(WUiTimer::Function function, app_assist::WView* view, Evas_Object* owner) {
-    note("addIdler", orNull(owner ? elm_object_widget_type_get(owner) : nullptr));
-    return addIdler(std::move(function), view, owner);
+    const std::string ownersType = orNull(owner ? elm_object_widget_type_get(owner) : nullptr);
+    note("addIdler", ownersType);
+    const auto noted = [function = std::move(function), ownersType](app_assist::WView* each) {
+        const bool again = function(each);
+        note("idlerRan", ownersType, again ? "again" : "once");
+        return again;
+    };
+    return addIdler(noted, view, owner);
 }
 
 CALL(Evas_Object*, elm_naviframe_add, Evas_Object* parent) {

@@ -54,6 +54,23 @@ TEST_F(LaterRequest, TurnsThePagerThatIsOpen) {
     EXPECT_THAT(newLog(), Contains(kest_log::info("KestContentView.cpp", "showContentsPage", "change view page to 3")));
 }
 
+TEST_F(LaterRequest, TurnsThePagerUnderAFingerThatDragsIt) {
+    writeCatalogue();
+    start({std::string("appID=") + clockId});
+    screen().press({600, 400});
+    for (int x = 580; x >= 300; x -= 20) {
+        test_ui::runFor(0.02);
+        screen().moveTo({x, 400});
+        if (x == 440)
+            request({{"appID", doorId}, {"page", "3"}});
+    }
+    screen().lift();
+    settle();
+    EXPECT_THAT(titles(), ElementsAre("Tips", "Tips 4/4"));
+    EXPECT_THAT(titleInView(), testing::HasSubstr("Lock"));
+    EXPECT_THAT(usage(), ElementsAre("KT03 Clock", "KT03 Lock"));
+}
+
 TEST_F(LaterRequest, TurnsThePagerToTheLastOfSeveralTips) {
     writeCatalogue();
     start();

@@ -143,6 +143,7 @@ TEST_F(RequestTest, PushesThePagerFirstAndTheListWhenTheMainLoopIsIdle) {
     });
     settle();
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
+    EXPECT_THAT(calls::madeOf({"idlerRan Elm_Naviframe"}), ElementsAre("idlerRan Elm_Naviframe once"));
 }
 
 TEST_F(RequestTest, MakesTheListBeforeThePager) {

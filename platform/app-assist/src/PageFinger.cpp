@@ -18,14 +18,15 @@ constexpr double flickWay = 0.1;
 
 }  // namespace
 
-void PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
+PageFinger& PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
     std::unique_ptr<PageFinger> finger(new PageFinger(scroller, guard));
     const auto onEvas = [&](Evas_Callback_Type event, Evas_Object_Event_Cb callback) {
         evas_object_event_callback_add(scroller, event, callback, finger.get());
     };
     onEvas(EVAS_CALLBACK_MOUSE_DOWN, [](void* self, Evas*, Evas_Object*, void* event) {
         const auto* down = static_cast<Evas_Event_Mouse_Down*>(event);
-        static_cast<PageFinger*>(self)->touched({down->timestamp / 1000.0, down->canvas.x});
+        if (down->button == 1)
+            static_cast<PageFinger*>(self)->touched({down->timestamp / 1000.0, down->canvas.x});
     });
     onEvas(EVAS_CALLBACK_MOUSE_MOVE, [](void* self, Evas*, Evas_Object*, void* event) {
         const auto* move = static_cast<Evas_Event_Mouse_Move*>(event);
@@ -48,11 +49,12 @@ void PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
         scroller, "scroll,drag,stop", [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->letGo(); },
         finger.get());
     // The scroller has it from now on.
-    static_cast<void>(finger.release());
+    return *finger.release();
 }
 
 void PageFinger::touched(Place place) {
     began_ = place.x;
+    kept_.reset();
     lately_.clear();
     moved(place);
 }
@@ -77,10 +79,15 @@ void PageFinger::turn() {
     job_ = nullptr;
     int last = 0;
     elm_scroller_last_page_get(scroller_, &last, nullptr);
-    const int pages = pagesToTurn();
-    const int page = page_ + pages;
-    if (pages != 0 && page >= 0 && page <= last)
+    const int page = pageToTurnTo();
+    if (page >= 0 && page <= last)
         guard_.redirect([&] { elm_scroller_page_bring_in(scroller_, page, 0); });
+}
+
+/// Below zero: the one that EFL decided on.
+int PageFinger::pageToTurnTo() const {
+    const int pages = pagesToTurn();
+    return kept_.value_or(pages != 0 ? page_ + pages : -1);
 }
 
 int PageFinger::pagesToTurn() const {

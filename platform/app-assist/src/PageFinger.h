@@ -3,16 +3,21 @@
 #include "BounceGuard.h"
 
 #include <deque>
+#include <optional>
 
 namespace app_assist {
 
 /// The finger on a scroller of pages: a flick or a long way turns the page, by one. EFL asks for nearly twice a flick's
-/// speed, and measures a way by a position that lags behind the finger.
+/// speed, and measures a way by a position that lags behind the finger. A page that is asked for under the finger comes
+/// when it lifts: EFL drags on from where the touch began, and forgets that page.
 /// Belongs to the scroller, and goes with it.
 class PageFinger {
 public:
-    /// For as long as the scroller lives. `guard` is that of the same scroller.
-    static void attach(Evas_Object* scroller, BounceGuard& guard);
+    /// For as long as the scroller lives, whose it is. `guard` is that of the same scroller.
+    static PageFinger& attach(Evas_Object* scroller, BounceGuard& guard);
+
+    /// `page` was brought into view, and is to stay there whatever a finger does that is on the scroller.
+    void keep(int page) { kept_ = page; }
 
 private:
     struct Place {
@@ -26,6 +31,7 @@ private:
     void dragged();
     void letGo();
     void turn();
+    int pageToTurnTo() const;
     int pagesToTurn() const;
 
     Evas_Object* scroller_;
@@ -33,7 +39,8 @@ private:
     /// Of the touch that is on or was the last: where it began, and where it was of late.
     int began_ = 0;
     std::deque<Place> lately_;
-    int page_ = 0;  ///< in view when the dragging began
+    int page_ = 0;             ///< in view when the dragging began
+    std::optional<int> kept_;  ///< asked for since the touch began
     Ecore_Job* job_ = nullptr;
 };
 

@@ -25,7 +25,7 @@ Evas_Object* WPageSlideView::onCreate(Evas_Object* parent, void*) {
         return nullptr;
     evas_object_size_hint_weight_set(scroller_, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
     evas_object_size_hint_align_set(scroller_, EVAS_HINT_FILL, EVAS_HINT_FILL);
-    PageFinger::attach(scroller_, BounceGuard::attach(scroller_));
+    finger_ = &PageFinger::attach(scroller_, BounceGuard::attach(scroller_));
     evas_object_event_callback_add(scroller_, EVAS_CALLBACK_RESIZE, scrollerResized, this);
     evas_object_smart_callback_add(
         scroller_, "scroll,page,changed",
@@ -118,6 +118,7 @@ void WPageSlideView::showPage(int index, bool relayout) {
         return;
     if (relayout)
         elm_box_recalculate(row_);
+    finger_->keep(index);
     show(index);
 }
 
@@ -159,7 +160,8 @@ void WPageSlideView::scrollerResized(void* data, Evas*, Evas_Object*, void*) {
     if (width == view->width_)
         return;
     const auto showAgain = [view](WView*) {
-        view->showPage(view->pageInView_, true);
+        elm_box_recalculate(view->row_);
+        view->show(view->pageInView_);
         return false;
     };
     WUiTimer::addJob(showAgain, view, view->scroller_);

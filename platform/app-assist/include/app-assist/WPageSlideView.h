@@ -6,6 +6,8 @@
 
 namespace app_assist {
 
+class PageFinger;
+
 /// A view of pages side by side, one in view at a time, that a swipe turns. Owns the pages that were appended.
 /// Only the page in view takes the focus. On the scroller, "scroll,anim,start" and "scroll,anim,stop" come in pairs.
 class WPageSlideView : public WView {
@@ -22,6 +24,7 @@ public:
     void appendPage(WView* page);
     /// Brings page `index` into view at once, also before anything was laid out. `relayout` has the pages laid
     /// out first, as is needed when they were just appended. An index outside the pages does nothing.
+    /// Under a finger that drags the pages on, it comes back when the finger lifts.
     void showPage(int index, bool relayout);
     int getPageCount() const { return static_cast<int>(pages_.size()); }
 
@@ -46,6 +49,7 @@ private:
 
     bool showScroll_ = false;
     Evas_Object* scroller_ = nullptr;
+    PageFinger* finger_ = nullptr;  ///< the scroller's
     Evas_Object* row_ = nullptr;
     /// The page that is shown, or will be when the scroller has a width.
     int pageInView_ = 0;
