@@ -61,13 +61,13 @@ protected:
     /// Right after a change: what the table says shows, everything works, and nothing was an error.
     void expectWhatTheCellSays(const Names& names, Language language);
     /// Opens a tip by request where there is one to open. Goes back to the list, or, where there is none, opens a tip
-    /// by request. Then the list has these rows, a tap on one opens its tip, the way back leads to the list, and usage
-    /// was recorded once a tip.
+    /// by request. Then the list has these rows, a tap on the last one opens its tip, the way back leads to the list,
+    /// and usage was recorded once a tip.
     void expectToWork(const Names& names, Language language);
     /// From a pager on the top. None of its views is gone too early.
     void expectTheWayBack();
     void expectARequestToOpenItsTip(const Names& names, Language language);
-    void expectTipsToOpen(const Names& names, Language language);
+    void expectTheLastTipToOpen(const Names& names, Language language);
 
 private:
     void openRow(std::size_t menu, double seconds);

@@ -1,4 +1,5 @@
 #include "PagerTest.h"
+#include "TimerCalls.h"
 
 using testing::Contains;
 using testing::ElementsAre;
@@ -53,22 +54,12 @@ TEST_F(Preparation, FillsTheOthersAfterFourTenthsOfASecond) {
 
 TEST_F(Preparation, FillsOneOfTheOthersAtATime) {
     open(1);
-    std::vector<long> counts;
-    std::function<void()> look = [&] {
-        const std::vector<bool> pages = filled();
-        const long count = std::count(pages.begin(), pages.end(), true);
-        if (counts.empty() || counts.back() != count)
-            counts.push_back(count);
-    };
-    Ecore_Idler* idler = ecore_idler_add(
-        [](void* each) -> Eina_Bool {
-            (*static_cast<std::function<void()>*>(each))();
-            return ECORE_CALLBACK_RENEW;
-        },
-        &look);
+    std::vector<std::vector<bool>> steps;
+    calls::afterIdler = [&] { steps.push_back(filled()); };
     test_ui::runFor(0.5);
-    ecore_idler_del(idler);
-    EXPECT_THAT(counts, ElementsAre(1, 2, 3));
+    calls::afterIdler = nullptr;
+    EXPECT_THAT(steps, ElementsAre(ElementsAre(true, true, false), ElementsAre(true, true, false),
+                                   ElementsAre(true, true, true)));
 }
 
 TEST_F(Preparation, ShowsThePageThatItFills) {

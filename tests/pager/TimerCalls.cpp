@@ -19,6 +19,8 @@ std::vector<calls::Timer> calls::newTimers() {
     return std::exchange(timers, {});
 }
 
+std::function<void()> calls::afterIdler;
+
 // WUiTimer::addTimer() and addIdler(), which the linker knows by these names.
 #define ADD_TIMER "_ZN10app_assist8WUiTimer8addTimerEdSt8functionIFbPNS_5WViewEEES3_P10_Eo_Opaque"
 #define ADD_IDLER "_ZN10app_assist8WUiTimer8addIdlerESt8functionIFbPNS_5WViewEEES3_P10_Eo_Opaque"
@@ -39,5 +41,11 @@ WUiTimer::Handle addAndNoteTimer(double seconds, WUiTimer::Function function, WV
 
 WUiTimer::Handle addAndNoteIdler(WUiTimer::Function function, WView* view, Evas_Object* owner) {
     timers.push_back({0, owner});
-    return addIdler(std::move(function), view, owner);
+    const auto noted = [function = std::move(function)](WView* each) {
+        const bool again = function(each);
+        if (calls::afterIdler)
+            calls::afterIdler();
+        return again;
+    };
+    return addIdler(noted, view, owner);
 }

@@ -2,6 +2,7 @@
 
 #include <Elementary.h>
 
+#include <functional>
 #include <vector>
 
 namespace calls {
@@ -16,5 +17,8 @@ struct Timer {
 
 /// The timers and idlers since the last call, in their order.
 std::vector<Timer> newTimers();
+
+/// What happens each time an idler has run, if anything.
+extern std::function<void()> afterIdler;
 
 }  // namespace calls
