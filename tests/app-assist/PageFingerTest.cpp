@@ -69,6 +69,23 @@ TEST_F(PageFinger, AFingerThatTurnsRoundTurnsNoPage) {
     EXPECT_THAT(heard(), ElementsAre("start", "stop 1"));
 }
 
+// What a page holds locks the movement while it takes a finger for itself, as a scroller of its own does.
+TEST_F(PageFinger, AFingerThatAPageTakesLeavesTheMovingPagesNotHalfway) {
+    listenTo(1);
+    swipeLeft();
+    test_ui::runFor(0.1);
+    screen().press({400, 700});
+    Evas_Object* content = pages_[2]->getEvasObj();
+    elm_object_scroll_lock_x_set(content, EINA_TRUE);
+    screen().lift();
+    elm_object_scroll_lock_x_set(content, EINA_FALSE);
+    test_ui::runFor(2.0);
+    EXPECT_EQ(0, test_ui::geometry(pages_[static_cast<size_t>(pager_->inView())]->getEvasObj()).x);
+    const std::string stop = "stop " + std::to_string(pager_->inView());
+    EXPECT_THAT(heard(), ElementsAre("start", stop, "start", stop));
+    EXPECT_EQ(0, framesInASecond());
+}
+
 class PageShownUnderAFinger : public PageMovement {
 protected:
     void press() {

@@ -15,6 +15,8 @@ public:
     /// For as long as the scroller lives, whose it is. To be called before others listen to the scroller.
     static BounceGuard& attach(Evas_Object* scroller);
 
+    /// Between a start and its stop.
+    bool isMoving() const { return moving_; }
     /// Runs what gives a movement another end; a movement that is under way stays the same one.
     void redirect(const std::function<void()>& change);
 

@@ -2,6 +2,7 @@
 
 #include "Guarded.h"
 
+#include <algorithm>
 #include <cstdlib>
 #include <memory>
 
@@ -32,10 +33,10 @@ PageFinger& PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
         const auto* move = static_cast<Evas_Event_Mouse_Move*>(event);
         static_cast<PageFinger*>(self)->moved({move->timestamp / 1000.0, move->cur.canvas.x});
     });
-    // A finger that rested before it was lifted did not flick.
     onEvas(EVAS_CALLBACK_MOUSE_UP, [](void* self, Evas*, Evas_Object*, void* event) {
         const auto* up = static_cast<Evas_Event_Mouse_Up*>(event);
-        static_cast<PageFinger*>(self)->moved({up->timestamp / 1000.0, up->canvas.x});
+        if (up->button == 1)
+            static_cast<PageFinger*>(self)->lifted({up->timestamp / 1000.0, up->canvas.x});
     });
     onEvas(EVAS_CALLBACK_FREE, [](void* data, Evas*, Evas_Object*, void*) {
         const std::unique_ptr<PageFinger> self(static_cast<PageFinger*>(data));
@@ -45,9 +46,6 @@ PageFinger& PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
     evas_object_smart_callback_add(
         scroller, "scroll,drag,start",
         [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->dragged(); }, finger.get());
-    evas_object_smart_callback_add(
-        scroller, "scroll,drag,stop", [](void* self, Evas_Object*, void*) { static_cast<PageFinger*>(self)->letGo(); },
-        finger.get());
     // The scroller has it from now on.
     return *finger.release();
 }
@@ -55,6 +53,7 @@ PageFinger& PageFinger::attach(Evas_Object* scroller, BounceGuard& guard) {
 void PageFinger::touched(Place place) {
     began_ = place.x;
     kept_.reset();
+    page_.reset();
     lately_.clear();
     moved(place);
 }
@@ -66,28 +65,52 @@ void PageFinger::moved(Place place) {
 }
 
 void PageFinger::dragged() {
-    elm_scroller_current_page_get(scroller_, &page_, nullptr);
+    int page = 0;
+    elm_scroller_current_page_get(scroller_, &page, nullptr);
+    page_ = page;
 }
 
-void PageFinger::letGo() {
-    // Not at once: EFL goes on to decide which page comes, and the finger's last place is told after this.
+void PageFinger::lifted(Place place) {
+    // A finger that rested before it was lifted did not flick.
+    moved(place);
+    // Not at once: EFL goes on to decide which page comes.
     if (!job_)
         job_ = ecore_job_add([](void* self) { static_cast<PageFinger*>(self)->turn(); }, this);
 }
 
 void PageFinger::turn() {
     job_ = nullptr;
-    int last = 0;
-    elm_scroller_last_page_get(scroller_, &last, nullptr);
-    const int page = pageToTurnTo();
-    if (page >= 0 && page <= last)
-        guard_.redirect([&] { elm_scroller_page_bring_in(scroller_, page, 0); });
+    if (const auto page = pageToTurnTo())
+        guard_.redirect([&] { elm_scroller_page_bring_in(scroller_, *page, 0); });
 }
 
-/// Below zero: the one that EFL decided on.
-int PageFinger::pageToTurnTo() const {
-    const int pages = pagesToTurn();
-    return kept_.value_or(pages != 0 ? page_ + pages : -1);
+/// None: where EFL decided that it goes.
+std::optional<int> PageFinger::pageToTurnTo() const {
+    if (kept_ && page_)
+        return kept_;
+    if (const auto page = neighbour())
+        return page;
+    if (guard_.isMoving() || !isHalfway())
+        return std::nullopt;
+    int page = 0;
+    elm_scroller_current_page_get(scroller_, &page, nullptr);
+    return page;
+}
+
+std::optional<int> PageFinger::neighbour() const {
+    const int pages = page_ ? pagesToTurn() : 0;
+    int last = 0;
+    elm_scroller_last_page_get(scroller_, &last, nullptr);
+    const int page = page_.value_or(0) + pages;
+    return pages != 0 && page >= 0 && page <= last ? std::optional(page) : std::nullopt;
+}
+
+/// Within a pixel it is at its place: a row of one page has that much more.
+bool PageFinger::isHalfway() const {
+    int x = 0, width = 0;
+    elm_scroller_region_get(scroller_, &x, nullptr, &width, nullptr);
+    const int beyond = width > 0 ? std::abs(x % width) : 0;
+    return std::min(beyond, width - beyond) > 1;
 }
 
 int PageFinger::pagesToTurn() const {

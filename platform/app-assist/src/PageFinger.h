@@ -9,7 +9,8 @@ namespace app_assist {
 
 /// The finger on a scroller of pages: a flick or a long way turns the page, by one. EFL asks for nearly twice a flick's
 /// speed, and measures a way by a position that lags behind the finger. A page that is asked for under the finger comes
-/// when it lifts: EFL drags on from where the touch began, and forgets that page.
+/// when it lifts: EFL drags on from where the touch began, and forgets that page. And a page does not stay halfway:
+/// EFL leaves it there at times when what lies upon it took the finger that stopped it.
 /// Belongs to the scroller, and goes with it.
 class PageFinger {
 public:
@@ -29,17 +30,19 @@ private:
     void touched(Place place);
     void moved(Place place);
     void dragged();
-    void letGo();
+    void lifted(Place place);
     void turn();
-    int pageToTurnTo() const;
+    std::optional<int> pageToTurnTo() const;
+    std::optional<int> neighbour() const;
     int pagesToTurn() const;
+    bool isHalfway() const;
 
     Evas_Object* scroller_;
     BounceGuard& guard_;
     /// Of the touch that is on or was the last: where it began, and where it was of late.
     int began_ = 0;
     std::deque<Place> lately_;
-    int page_ = 0;             ///< in view when the dragging began
+    std::optional<int> page_;  ///< in view when that touch began to drag, if it did
     std::optional<int> kept_;  ///< asked for since the touch began
     Ecore_Job* job_ = nullptr;
 };
