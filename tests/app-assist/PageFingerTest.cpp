@@ -183,8 +183,8 @@ TEST_F(PageShownUnderAFinger, StaysWhenAnotherButtonIsPressed) {
     press();
     dragTo(460);
     pager_->showPage(4, false);
-    evas_event_feed_mouse_down(screen().canvas(), 3, EVAS_BUTTON_NONE, ecore_loop_time_get() * 1000, nullptr);
-    evas_event_feed_mouse_up(screen().canvas(), 3, EVAS_BUTTON_NONE, ecore_loop_time_get() * 1000, nullptr);
+    evas_event_feed_mouse_down(screen().canvas(), 3, EVAS_BUTTON_NONE, test_ui::clock::timestamp(), nullptr);
+    evas_event_feed_mouse_up(screen().canvas(), 3, EVAS_BUTTON_NONE, test_ui::clock::timestamp(), nullptr);
     dragTo(200);
     liftAndRest();
     expectInView(4);

@@ -65,9 +65,7 @@ void PageFinger::moved(Place place) {
 }
 
 void PageFinger::dragged() {
-    int page = 0;
-    elm_scroller_current_page_get(scroller_, &page, nullptr);
-    page_ = page;
+    page_ = pageInView();
 }
 
 void PageFinger::lifted(Place place) {
@@ -92,6 +90,10 @@ std::optional<int> PageFinger::pageToTurnTo() const {
         return page;
     if (guard_.isMoving() || !isHalfway())
         return std::nullopt;
+    return pageInView();
+}
+
+int PageFinger::pageInView() const {
     int page = 0;
     elm_scroller_current_page_get(scroller_, &page, nullptr);
     return page;
@@ -99,10 +101,12 @@ std::optional<int> PageFinger::pageToTurnTo() const {
 
 std::optional<int> PageFinger::neighbour() const {
     const int pages = page_ ? pagesToTurn() : 0;
+    if (pages == 0)
+        return std::nullopt;
     int last = 0;
     elm_scroller_last_page_get(scroller_, &last, nullptr);
-    const int page = page_.value_or(0) + pages;
-    return pages != 0 && page >= 0 && page <= last ? std::optional(page) : std::nullopt;
+    const int page = *page_ + pages;
+    return page >= 0 && page <= last ? std::optional(page) : std::nullopt;
 }
 
 /// Within a pixel it is at its place: a row of one page has that much more.

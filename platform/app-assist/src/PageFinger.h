@@ -34,6 +34,7 @@ private:
     void turn();
     std::optional<int> pageToTurnTo() const;
     std::optional<int> neighbour() const;
+    int pageInView() const;
     int pagesToTurn() const;
     bool isHalfway() const;
 
