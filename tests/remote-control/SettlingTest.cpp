@@ -2,6 +2,7 @@
 
 #include "SampleTest.h"
 #include "ScrollWatch.h"
+#include "ui/Clock.h"
 
 using remote_control::ScrollWatch;
 using remote_control::Settling;
@@ -47,6 +48,26 @@ TEST_F(ScreenSettling, ATransitionIsWaitedFor) {
     elm_genlist_item_selected_set(elm_genlist_first_item_get(sample_->list()), EINA_TRUE);
 
     EXPECT_GT(settledAfter(), 0.3);
+    EXPECT_FALSE(find(read(), "Elm_Genlist").visible());
+}
+
+TEST_F(ScreenSettling, ATransitionThatGetsNoTimeToMoveIsWaitedFor) {
+    elm_genlist_item_selected_set(elm_genlist_first_item_get(sample_->list()), EINA_TRUE);
+    bool settled = false;
+    const ScrollWatch scrolls(evas_object_evas_get(window()));
+    const Settling settling(evas_object_evas_get(window()), scrolls, [&] { settled = true; });
+    ecore_timer_add(
+        0.1,
+        [](void*) -> Eina_Bool {
+            test_ui::clock::stop();
+            return ECORE_CALLBACK_CANCEL;
+        },
+        nullptr);
+
+    test_ui::runFor(1);
+    EXPECT_FALSE(settled);
+
+    EXPECT_TRUE(test_ui::runUntil([&] { return settled; }));
     EXPECT_FALSE(find(read(), "Elm_Genlist").visible());
 }
 

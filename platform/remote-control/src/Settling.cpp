@@ -9,6 +9,10 @@ namespace {
 
 constexpr double quietSeconds = 0.15;
 constexpr double mostSeconds = 3;
+/// Animations are ticked from a thread of the toolkit's. On a busy machine that gets no time for longer than a screen
+/// is quiet, and a transition stands still; so a screen is quiet only when ticks went by without a frame. Fewer than
+/// fit into that time, since late ones are dropped.
+constexpr int quietTicks = 5;
 
 }  // namespace
 
@@ -18,6 +22,7 @@ Settling::Settling(Evas* canvas, const ScrollWatch& scrolls, std::function<void(
     evas_event_callback_add(canvas_, EVAS_CALLBACK_RENDER_POST, onFrameEnd, this);
     evas_event_callback_add(canvas_, EVAS_CALLBACK_FREE, onCanvasFree, this);
     deadline_ = ecore_timer_add(mostSeconds, onDeadline, this);
+    ticker_ = ecore_animator_add(onTick, this);
     waitForQuiet();
 }
 
@@ -38,6 +43,10 @@ void Settling::leave() {
             *timer = nullptr;
         }
     }
+    if (ticker_) {
+        ecore_animator_del(ticker_);
+        ticker_ = nullptr;
+    }
     if (idle_) {
         ecore_idler_del(idle_);
         idle_ = nullptr;
@@ -52,6 +61,7 @@ void Settling::finish() {
 }
 
 void Settling::waitForQuiet() {
+    ticks_ = 0;
     if (idle_) {
         ecore_idler_del(idle_);
         idle_ = nullptr;
@@ -81,9 +91,14 @@ void Settling::onCanvasFree(void* data, Evas*, void*) {
     self->leave();
 }
 
+Eina_Bool Settling::onTick(void* data) {
+    ++static_cast<Settling*>(data)->ticks_;
+    return ECORE_CALLBACK_RENEW;
+}
+
 Eina_Bool Settling::onQuiet(void* data) {
     auto* self = static_cast<Settling*>(data);
-    if (self->drawing_) {
+    if (self->drawing_ || self->ticks_ < quietTicks) {
         return ECORE_CALLBACK_RENEW;
     }
     // Work that kept the loop busy may be what the next frame shows: the loop must come to rest as well.
