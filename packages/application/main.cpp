@@ -55,6 +55,7 @@ class RequestedApp : public app_assist::WApp {
     bool onCreate() override {
         const Self self;
         attachWindow(new app_assist::WWindow(self.label.c_str(), ELM_WIN_BASIC));
+        elm_win_title_set(getWindow()->getEvasObj(), self.label.c_str());
         auto* naviframe = new app_assist::WNaviframe();
         getWindow()->attachBaseUiObject(naviframe, nullptr);
         auto* view = new RequestView(self.icon);

@@ -47,6 +47,7 @@ TEST_F(LaunchedApplication, ShowsItsNameItsIconAndWhatItWasGiven) {
     launch({{"page", "walk"}, {"cup", "2"}});
     waitForText("page: walk");
     EXPECT_THAT(lines(), ElementsAre("cup: 2", "page: walk"));
+    EXPECT_EQ(tree()["title"], "Clock");
     const std::string screen = tree().dump();
     EXPECT_THAT(screen, HasSubstr("\"text\":\"Clock\""));
     EXPECT_THAT(screen, HasSubstr("com.ravella.clock/shared/res/clock.png"));
@@ -104,6 +105,7 @@ TEST_F(LaunchedApplication, FollowsTheLanguageAndTheTheme) {
     device_.must({"set", "theme", "dark"});
     device_.must({"set", "language", "ko_KR"});
     EXPECT_THAT(lines(), ElementsAre("page: walk"));
+    EXPECT_EQ(tree()["title"], "시계");
 }
 
 TEST_F(LaunchedApplication, IsWaitedForWhileItIsNotThereYet) {
