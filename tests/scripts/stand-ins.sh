@@ -25,7 +25,7 @@ END"
 # stand_in_that NAME COMMANDS: a tool that does what the commands say.
 stand_in_that() {
     printf '#!%s\n%s\n' "$shell" "$2" >"$path/$1"
-    chmod +x "$path/$1"
+    chmod a+rx "$path/$1"
 }
 
 # expect WHAT WANTED GOT
