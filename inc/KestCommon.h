@@ -34,7 +34,10 @@ public:
     /// file's "state" texts name these regions.
     static std::string getRegion();
 
-    /// The shared resource directory of an application, with a slash at its end; the application's own fixed one
-    /// when the application manager does not know `appid`.
+    /// Sets `path` to the shared resource directory of an application, with a slash at its end; false, and `path` as it
+    /// was, when the application manager does not tell it.
+    static bool findSharedResourcePath(const std::string& appid, std::string& path);
+
+    /// As findSharedResourcePath(), or the application's own fixed directory where it finds none.
     static std::string getSharedResourcePath(const std::string& appid);
 };

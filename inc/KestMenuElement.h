@@ -10,5 +10,5 @@
 class KestMenuElement {
 public:
     /// A fresh record with what the element says: path, application, and whether the tip is offered in the region.
-    static KestContentInfo read(const xmlNode* menu, const std::string& region);
+    static KestContentInfo read(const xmlNode* menu);
 };

@@ -10,8 +10,9 @@ class KestTranslator {
 public:
     KestTranslator();
 
-    /// The display language as the device gives it, for the string files; null where it gives none.
-    void useLanguage(const char* language);
+    /// Asks the device for the display language again, when a text is looked for in the string files. It is asked until
+    /// it answers.
+    void forgetLanguage() { hasDisplayLanguage = false; }
 
     /// Whether translate() would find a translation.
     bool knows(const std::string& id, const std::string& domain) const;
@@ -25,6 +26,7 @@ private:
     const std::string* __findInStrings(const std::string& id) const;
 
     KestStringTable stringTable;
-    std::string displayLanguage;
-    bool hasDisplayLanguage;
+    /// As the device told it, once it did.
+    mutable std::string displayLanguage;
+    mutable bool hasDisplayLanguage;
 };

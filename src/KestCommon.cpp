@@ -3,6 +3,7 @@
 #include "KestLog.h"
 #include "KestPaths.h"
 #include "KestPlatformString.h"
+#include "KestVconfKeys.h"
 
 #include <app_common.h>
 #include <app_manager.h>
@@ -135,7 +136,7 @@ std::string KestCommon::getEdjFilePath(bool useResourceManager) {
 }
 
 std::string KestCommon::getRegion() {
-    const KestPlatformString value(vconf_get_str("db/csc/text_string_country"));
+    const KestPlatformString value(vconf_get_str(kest_vconf_keys::country));
     if (!value) {
         return "Global";
     }
@@ -157,10 +158,16 @@ std::string KestCommon::getRegion() {
     return contains(africa, country) ? "Africa" : "Global";
 }
 
-std::string KestCommon::getSharedResourcePath(const std::string& appid) {
-    KestPlatformString path;
-    if (app_manager_get_shared_resource_path(appid.c_str(), path.out()) != APP_MANAGER_ERROR_NONE || !path) {
-        return kest_paths::sharedResources;
+bool KestCommon::findSharedResourcePath(const std::string& appid, std::string& path) {
+    KestPlatformString answer;
+    if (app_manager_get_shared_resource_path(appid.c_str(), answer.out()) != APP_MANAGER_ERROR_NONE || !answer) {
+        return false;
     }
-    return path.str();
+    path = answer.str();
+    return true;
+}
+
+std::string KestCommon::getSharedResourcePath(const std::string& appid) {
+    std::string path;
+    return findSharedResourcePath(appid, path) ? path : kest_paths::sharedResources;
 }

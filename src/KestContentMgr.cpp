@@ -1,6 +1,5 @@
 #include "KestContentMgr.h"
 
-#include "KestCommon.h"
 #include "KestContentCache.h"
 #include "KestLog.h"
 #include "KestMarkup.h"
@@ -10,6 +9,7 @@
 #include "KestPlatformString.h"
 #include "KestTextGrowth.h"
 #include "KestTextTags.h"
+#include "KestVconfKeys.h"
 #include "KestXmlDocument.h"
 
 #include <unistd.h>
@@ -18,7 +18,6 @@
 namespace {
 
 const char menuFile[] = "contents/kest_menu.xml";
-const char languageKey[] = "db/menu_widget/language";
 
 /// More menus than anybody scrolls through; only files that go wrong have them.
 const size_t mostMenus = 20000;
@@ -61,8 +60,8 @@ bool KestContentMgr::loadContentsList(bool force) {
 
     // Until the load has finished no version is right, so one that is cut short leaves the cache invalid.
     KestContentCache::writeVersion("");
-    const KestPlatformString language(vconf_get_str(languageKey));
-    translator.useLanguage(language.get());
+    const KestPlatformString language(vconf_get_str(kest_vconf_keys::displayLanguage));
+    translator.forgetLanguage();
     if (language) {
         KestContentCache::writeLanguage(language.str());
     }
@@ -92,13 +91,12 @@ bool KestContentMgr::__loadMainMenu() {
         return false;
     }
     const xmlNode* menus = document.findSection("menus");
-    const std::string region = KestCommon::getRegion();
     size_t offered = 0;
     for (xmlNode* menu = menus ? menus->children : nullptr; menu; menu = menu->next) {
         if (!KestXmlDocument::isElement(menu, "menu")) {
             continue;
         }
-        const KestContentInfo record = KestMenuElement::read(menu, region);
+        const KestContentInfo record = KestMenuElement::read(menu);
         if (!record.isAvailable) {
             continue;
         }
@@ -263,7 +261,7 @@ bool KestContentMgr::__checkCacheAvailable() {
     if (!KestContentCache::readLanguage(cachedLanguage)) {
         return false;
     }
-    const KestPlatformString language(vconf_get_str(languageKey));
+    const KestPlatformString language(vconf_get_str(kest_vconf_keys::displayLanguage));
     if (!language || language.str() != cachedLanguage) {
         KEST_INFO("Language changed");
         return false;

@@ -125,8 +125,13 @@ void KestContentSubView::__setInfoArea(Evas_Object* pageLayout) {
         [](void* data, Evas_Object*, void*) {
             KEST_HIT();
             try {
+                const auto* page = static_cast<const KestContentSubView*>(data);
+                if (!page) {
+                    KEST_ERR("data is null");
+                    return;
+                }
                 KestContentInfo tapped;
-                if (static_cast<const KestContentSubView*>(data)->__copyRecord(tapped)) {
+                if (page->__copyRecord(tapped)) {
                     __launch(tapped);
                 }
             } catch (const std::exception& error) {

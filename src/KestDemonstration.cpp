@@ -173,26 +173,46 @@ void KestDemonstration::__end() {
 }
 
 void KestDemonstration::__sequencePressedCb(void* data, Evas_Object*, const char*, const char*) try {
+    auto* demonstration = static_cast<KestDemonstration*>(data);
+    if (!demonstration) {
+        KEST_ERR("data is null");
+        return;
+    }
     KestUsageLog::replyPressed();
-    static_cast<KestDemonstration*>(data)->__press();
+    demonstration->__press();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }
 
 void KestDemonstration::__sequenceReleasedCb(void* data, Evas_Object*, const char*, const char*) try {
-    static_cast<KestDemonstration*>(data)->__releaseSequence();
+    auto* demonstration = static_cast<KestDemonstration*>(data);
+    if (!demonstration) {
+        KEST_ERR("data is null");
+        return;
+    }
+    demonstration->__releaseSequence();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }
 
 void KestDemonstration::__tallPressedCb(void* data, Evas_Object*, const char*, const char*) try {
-    static_cast<KestDemonstration*>(data)->__press();
+    auto* demonstration = static_cast<KestDemonstration*>(data);
+    if (!demonstration) {
+        KEST_ERR("data is null");
+        return;
+    }
+    demonstration->__press();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }
 
 void KestDemonstration::__tallReleasedCb(void* data, Evas_Object*, const char*, const char*) try {
-    static_cast<KestDemonstration*>(data)->__releaseTall();
+    auto* demonstration = static_cast<KestDemonstration*>(data);
+    if (!demonstration) {
+        KEST_ERR("data is null");
+        return;
+    }
+    demonstration->__releaseTall();
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());
 }

@@ -1,8 +1,9 @@
 #include "KestMenuElement.h"
 
+#include "KestCommon.h"
 #include "KestXmlDocument.h"
 
-KestContentInfo KestMenuElement::read(const xmlNode* menu, const std::string& region) {
+KestContentInfo KestMenuElement::read(const xmlNode* menu) {
     KestContentInfo record;
     for (xmlNode* node = menu->children; node; node = node->next) {
         const std::string text = KestXmlDocument::str(KestXmlDocument::content(node));
@@ -11,7 +12,7 @@ KestContentInfo KestMenuElement::read(const xmlNode* menu, const std::string& re
         } else if (KestXmlDocument::isElement(node, "appid")) {
             record.appid = text;
         } else if (KestXmlDocument::isElement(node, "state")) {
-            record.isAvailable = text != "NOK" && text.find(region) != std::string::npos;
+            record.isAvailable = text != "NOK" && text.find(KestCommon::getRegion()) != std::string::npos;
         }
     }
     return record;

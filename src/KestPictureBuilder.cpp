@@ -265,6 +265,8 @@ void KestPictureBuilder::__setFile(Evas_Object* image, const std::string& path) 
         KEST_WARN("the file breaks off: %s", path.c_str());
         return;
     }
+    // An image is decoded by a thread as soon as it has a file: one refused for its size would take its memory yet.
+    elm_image_preload_disabled_set(image, EINA_TRUE);
     elm_image_file_set(image, path.c_str(), nullptr);
     int width = 0;
     int height = 0;
@@ -272,6 +274,8 @@ void KestPictureBuilder::__setFile(Evas_Object* image, const std::string& path) 
     if (std::int64_t{width} * height > mostPixels) {
         KEST_WARN("%d x %d pixels are too many: %s", width, height, path.c_str());
         elm_image_file_set(image, nullptr, nullptr);
+    } else if (width > 0 && height > 0) {
+        elm_image_preload_disabled_set(image, EINA_FALSE);
     }
 }
 

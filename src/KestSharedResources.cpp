@@ -1,8 +1,17 @@
 #include "KestSharedResources.h"
 
 #include "KestCommon.h"
+#include "KestPaths.h"
 
-const std::string& KestSharedResources::of(const std::string& appid) {
+std::string KestSharedResources::of(const std::string& appid) {
     const auto known = folders.find(appid);
-    return known != folders.end() ? known->second : folders[appid] = KestCommon::getSharedResourcePath(appid);
+    if (known != folders.end()) {
+        return known->second;
+    }
+    std::string path;
+    if (!KestCommon::findSharedResourcePath(appid, path)) {
+        return kest_paths::sharedResources;
+    }
+    folders[appid] = path;
+    return path;
 }

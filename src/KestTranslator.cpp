@@ -1,9 +1,12 @@
 #include "KestTranslator.h"
 
 #include "KestPaths.h"
+#include "KestPlatformString.h"
 #include "KestTextDomain.h"
+#include "KestVconfKeys.h"
 
 #include <libintl.h>
+#include <vconf.h>
 
 namespace {
 
@@ -13,11 +16,6 @@ const char systemDomain[] = "sys_string";
 }  // namespace
 
 KestTranslator::KestTranslator() : hasDisplayLanguage(false) {}
-
-void KestTranslator::useLanguage(const char* language) {
-    hasDisplayLanguage = language != nullptr;
-    displayLanguage = language ? language : "";
-}
 
 bool KestTranslator::knows(const std::string& id, const std::string& domain) const {
     // The text of the empty id is the header of the gettext catalogue.
@@ -48,5 +46,13 @@ std::string KestTranslator::translate(const std::string& id, const std::string& 
 }
 
 const std::string* KestTranslator::__findInStrings(const std::string& id) const {
-    return hasDisplayLanguage ? stringTable.find(displayLanguage, id) : nullptr;
+    if (!hasDisplayLanguage) {
+        const KestPlatformString language(vconf_get_str(kest_vconf_keys::displayLanguage));
+        if (!language) {
+            return nullptr;
+        }
+        displayLanguage = language.str();
+        hasDisplayLanguage = true;
+    }
+    return stringTable.find(displayLanguage, id);
 }

@@ -281,12 +281,17 @@ TEST_F(Application, HasTheToolkitsErrorsInTheDevicesLog) {
     EXPECT_THAT(log, testing::Not(testing::HasSubstr("worried")));
 }
 
-TEST_F(Application, FindsItsOwnTextsAndTheDevices) {
+TEST_F(Application, FindsItsOwnTextsAndTheDevicesAsSoonAsItIsCreated) {
+    int looks = 0;
+    app_.inCreate = [&] {
+        ++looks;
+        EXPECT_STREQ((device_.appRoot() / "res/locale").c_str(), bindtextdomain("app", nullptr));
+        EXPECT_STREQ("UTF-8", bind_textdomain_codeset("app", nullptr));
+        EXPECT_STREQ((device_.data() / "locale").c_str(), bindtextdomain("sys_string", nullptr));
+        EXPECT_STREQ("UTF-8", bind_textdomain_codeset("sys_string", nullptr));
+    };
     RunningApp running(app_);
-    EXPECT_EQ((device_.appRoot() / "res/locale").string(), bindtextdomain("app", nullptr));
-    EXPECT_STREQ("UTF-8", bind_textdomain_codeset("app", nullptr));
-    EXPECT_EQ((device_.data() / "locale").string(), bindtextdomain("sys_string", nullptr));
-    EXPECT_STREQ("UTF-8", bind_textdomain_codeset("sys_string", nullptr));
+    EXPECT_EQ(1, looks);
 }
 
 }  // namespace

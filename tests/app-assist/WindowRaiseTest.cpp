@@ -68,9 +68,9 @@ protected:
         asked.clear();
     }
 
-    void send() {
-        client_.send({device_.appId(), device::bus::pathOf(device_.appId()), device::bus::applicationInterface},
-                     "Launch", {BusClient::texts({{"page", "2"}})});
+    void launch() { send(device::bus::applicationInterface, "Launch", {BusClient::texts({{"page", "2"}})}); }
+    void send(const char* interface, const char* method, const std::vector<BusClient::Argument>& arguments) {
+        client_.send({device_.appId(), device::bus::pathOf(device_.appId()), interface}, method, arguments);
         client_.call({"org.freedesktop.DBus", "/org/freedesktop/DBus", "org.freedesktop.DBus"}, "GetId");
         poll(nullptr, 0, 50);
         test_ui::runFor(1.0);
@@ -87,13 +87,25 @@ TEST_F(WindowAtARequest, ComesToTheFrontForEveryLaterOne) {
     test_ui::runFor(1.0);
     ASSERT_EQ(watched, running.window());
     asked.clear();
-    send();
+    launch();
     EXPECT_THAT(std::exchange(asked, {}), ElementsAre("bring back", "raise", "activate"));
-    send();
+    launch();
     EXPECT_THAT(asked, ElementsAre("bring back", "raise", "activate"));
 }
 
-TEST_F(WindowAtARequest, IsWhereItIsForTheFirstOne) {
+TEST_F(WindowAtARequest, ComesToTheFrontForADesktopsRequestToo) {
+    device_->setApplication({device_.appId(), device_.appRoot(), device::Link("tea:{cup}")});
+    RunningApp running(app_);
+    test_ui::runFor(1.0);
+    asked.clear();
+    const BusClient::Argument noData = BusClient::nothing("{sv}");
+    send("org.freedesktop.Application", "Activate", {noData});
+    EXPECT_THAT(std::exchange(asked, {}), ElementsAre("bring back", "raise", "activate"));
+    send("org.freedesktop.Application", "Open", {BusClient::list({"tea:green"}), noData});
+    EXPECT_THAT(asked, ElementsAre("bring back", "raise", "activate"));
+}
+
+TEST_F(WindowAtARequest, IsWhereItIsForTheFirstOneThatItWasStartedWith) {
     RunningApp running(app_);
     ASSERT_EQ(watched, running.window());
     test_ui::runFor(1.0);
@@ -101,12 +113,12 @@ TEST_F(WindowAtARequest, IsWhereItIsForTheFirstOne) {
     EXPECT_THAT(asked, IsEmpty());
 }
 
-TEST_F(WindowAtARequest, IsWhereItIsForTheFirstOneThatTheBusBrings) {
+TEST_F(WindowAtARequest, ComesToTheFrontForTheFirstOneThatTheBusBrings) {
     RunningApp running(app_, {"--dbus-activated"});
     test_ui::runFor(1.0);
-    send();
+    launch();
     EXPECT_THAT(app_.story, testing::Contains("onAppControl com.example.app first page=2"));
-    EXPECT_THAT(asked, IsEmpty());
+    EXPECT_THAT(asked, ElementsAre("bring back", "raise", "activate"));
 }
 
 }  // namespace

@@ -37,6 +37,19 @@ TEST_F(Detail, FillsTheRecord) {
     EXPECT_EQ(record.launchParamValue, "value");
 }
 
+TEST_F(Detail, TakesItsTextsAsTheyStand) {
+    const KestContentInfo record =
+        loadTip("<textdomain> tips </textdomain><appname> Name </appname><image> a.png </image>"
+                "<launchappid> com.example.app </launchappid><launchparamkey> key </launchparamkey>"
+                "<launchparamvalue> value </launchparamvalue>");
+    EXPECT_EQ(record.textdomain, " tips ");
+    EXPECT_EQ(record.appName, " Name ");
+    EXPECT_EQ(record.imagePath, resources().string() + "/ a.png ");
+    EXPECT_EQ(record.launchAppid, " com.example.app ");
+    EXPECT_EQ(record.launchParamKey, " key ");
+    EXPECT_EQ(record.launchParamValue, " value ");
+}
+
 TEST_F(Detail, HasDefaultsForWhatItLacks) {
     const KestContentInfo record = loadTip("");
     EXPECT_EQ(record.menuTitle, "No Title");

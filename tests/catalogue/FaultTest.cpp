@@ -123,3 +123,30 @@ TEST_F(Fault, OfTheMainMenusFolderReadsTheFixedMainMenuOnly) {
     plan("app_manager_get_shared_resource_path", APP_MANAGER_ERROR_IO_ERROR);
     EXPECT_THAT(paths(load()), ElementsAre("contents/fallback.xml"));
 }
+
+TEST_F(Fault, OfOneReadOfTheDisplayLanguageIsForgottenAtTheNext) {
+    writeStrings({{"en_US", "IDS_A", "Apple"}, {"en_US", "IDS_B", "Pear"}});
+    // The region, the language of the cache, then that of the texts.
+    plan("vconf_get_str", -1, 2, 1);
+    EXPECT_EQ(loadContents(textTag("IDS_A") + " " + textTag("IDS_B")), "IDS_A Pear");
+}
+
+TEST_F(Fault, OfOneReadOfTheCountryIsForgottenAtTheNext) {
+    setCountry("IN");
+    writeDetail("<title>A</title>", "contents/a.xml");
+    writeDetail("<title>B</title>", "contents/b.xml");
+    writeMenus({{"contents/a.xml"}, {"contents/b.xml", kest, "India"}});
+    plan("vconf_get_str", -1);
+    EXPECT_THAT(titles(load()), ElementsAre("A", "B"));
+}
+
+TEST_F(Fault, OfOneLookForTheSharedFolderIsForgottenAtTheNext) {
+    addApplication("com.example.clock");
+    writeMenus({{"contents/fallback.xml", "com.example.clock"}});
+    writeDetail("<title>Own</title><image>a.png</image>", "contents/fallback.xml", "com.example.clock");
+    // The main menu's, then the one that tells whether the tip is there: the fixed folder has it too.
+    plan("app_manager_get_shared_resource_path", APP_MANAGER_ERROR_IO_ERROR, 1, 1);
+    const KestContentInfo record = load().at(0);
+    EXPECT_EQ(record.menuTitle, "Own");
+    EXPECT_EQ(record.imagePath, (resources("com.example.clock") / "a.png").string());
+}

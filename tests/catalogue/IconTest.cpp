@@ -80,6 +80,17 @@ TEST_F(Icon, IsEmptyWithoutAnApplication) {
     EXPECT_THAT(errors(), IsEmpty());
 }
 
+TEST_F(Icon, IsEmptyWithoutAnApplicationThoughTheCacheHasOne) {
+    addApplication("com.example.clock");
+    writeMenus({{"contents/fallback.xml", "com.example.clock"}});
+    writeDetail("<title>Title</title>", "contents/fallback.xml", "com.example.clock");
+    ASSERT_NE(load().at(0).iconPath, "");
+    writeMenus({{"contents/fallback.xml", ""}});
+    const KestContentInfo record = load(false).at(0);
+    EXPECT_EQ(record.menuTitle, "Title") << "from the cache";
+    EXPECT_EQ(record.iconPath, "");
+}
+
 TEST_F(Icon, IsATextInTheCachedPathToo) {
     writeMenus({{"contents/fallback.xml", "com.example.gone"}});
     load();

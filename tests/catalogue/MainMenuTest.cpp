@@ -68,6 +68,13 @@ TEST_F(MainMenu, IgnoresUnknownChildrenOfAMenu) {
     EXPECT_THAT(warnings(), IsEmpty());
 }
 
+TEST_F(MainMenu, TakesItsTextsAsTheyStand) {
+    menu("contents/a.xml");
+    writeMenus({{" contents/a.xml"}, {"contents/a.xml ", kest}, {"contents/a.xml", " " + kest}});
+    EXPECT_THAT(loadedPaths(), IsEmpty());
+    EXPECT_EQ(warnings().size(), 3U);
+}
+
 TEST_F(MainMenu, LetsALaterElementOverrideAnEarlierOne) {
     menu("contents/b.xml");
     writeMainMenu(mainMenu("<menu><state>NOK</state><path>contents/a.xml</path><appid>none</appid>"

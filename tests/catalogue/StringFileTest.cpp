@@ -134,6 +134,13 @@ TEST_F(StringFile, IsRememberedWhenItHasGone) {
     EXPECT_EQ(titleOf("IDS_MINE"), "Mine");
 }
 
+TEST_F(StringFile, TakesItsTextsAsTheyStand) {
+    writeStrings({{" en_US", "IDS_MINE", "Mine"}, {"en_US", " IDS_OTHER ", " Other "}});
+    EXPECT_EQ(titleOf("IDS_MINE"), "untranslated");
+    EXPECT_EQ(titleOf("IDS_OTHER"), "untranslated");
+    EXPECT_EQ(titleOf(" IDS_OTHER "), " Other ");
+}
+
 TEST_F(StringFile, DoesNotKeepAnEntryWithoutAnId) {
     writeStrings({{"en_US", "", "Nothing's text"}});
     EXPECT_EQ(titleOf(""), "untranslated");

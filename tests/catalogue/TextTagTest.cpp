@@ -41,6 +41,12 @@ TEST_F(TextTag, MayHaveOtherAttributesBeforeItsId) {
     EXPECT_EQ(loadContents("<text class=\"x\" id=\"IDS_SYSTEM\">a</text>"), "System text");
 }
 
+TEST_F(TextTag, HasAllForItsIdThatStandsBeforeTheFirstQuoteAtAnEnd) {
+    EXPECT_EQ(loadContents("<text id=\"IDS_SYSTEM\" class=\"x\">y</text>"), "IDS_SYSTEM\" class=\"x");
+    EXPECT_EQ(loadContents("<text xid=\"IDS_SYSTEM\">y</text>"), "System text");
+    EXPECT_FALSE(sawFaultyTag());
+}
+
 TEST_F(TextTag, MayBeginInATranslation) {
     for (std::size_t length = 1; length <= sizeof("<text") - 1; ++length) {
         writeStrings({{"en", "IDS_A", std::string("<text").substr(0, length)}});

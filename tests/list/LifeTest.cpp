@@ -53,9 +53,12 @@ TEST_F(Life, TakesTheThemesFileOfTheDisplaysDensity) {
     device()->settings().set(device::keys::screen, "480x800");
     startEmpty();
     calls::made().themeExtensions.clear();
+    newLog();
     auto* view = new KestMainView(true);
     EXPECT_THAT(calls::made().themeExtensions, ElementsAre(theme.string()));
     naviframe().push(view, nullptr, nullptr);
+    const auto asked = kest_log::info("KestCommon.cpp", "getEdjFilePath", "edje resource path[" + theme.string() + "]");
+    EXPECT_EQ(std::ranges::count(newLog(), asked), 2) << "for the theme, and again for the layout";
     const char* file = nullptr;
     const char* group = nullptr;
     elm_layout_file_get(view->getEvasObj(), &file, &group);

@@ -27,6 +27,7 @@ std::vector<std::string> otherCalls;
 std::map<std::string, int> failing;
 std::map<std::string, int> throwing;
 std::map<std::string, Evas_Smart_Cb> smartCallbacks;
+std::map<std::string, Edje_Signal_Cb> signalCallbacks;
 uxt_theme_changed_cb lastThemeCallback = nullptr;
 int screenWidth = 0;
 std::vector<const Evas_Object*> windowsAsked;
@@ -159,6 +160,10 @@ Evas_Smart_Cb calls::smartCallback(const std::string& event) {
     return smartCallbacks.at(event);
 }
 
+Edje_Signal_Cb calls::signalCallback(const std::string& signal) {
+    return signalCallbacks.at(signal);
+}
+
 uxt_theme_changed_cb calls::themeCallback() {
     return lastThemeCallback;
 }
@@ -257,6 +262,12 @@ CALL(void, evas_object_smart_callback_add, Evas_Object* object, const char* even
     note("callback", event);
     smartCallbacks[event] = function;
     __real_evas_object_smart_callback_add(object, event, function, data);
+}
+
+CALL(void, edje_object_signal_callback_add, Evas_Object* object, const char* signal, const char* source,
+     Edje_Signal_Cb function, void* data) {
+    signalCallbacks[signal] = function;
+    __real_edje_object_signal_callback_add(object, signal, source, function, data);
 }
 
 CALL(void, uxt_theme_add_changed_callback, Evas_Object* object, uxt_theme_changed_cb callback, void* data) {

@@ -39,6 +39,8 @@ std::vector<const Evas_Object*> windowsAskedForTheScreen();
 
 /// The callback that was registered last for that smart event.
 Evas_Smart_Cb smartCallback(const std::string& event);
+/// The same for that signal of a theme.
+Edje_Signal_Cb signalCallback(const std::string& signal);
 /// The callback that was registered last for changes of the theme.
 uxt_theme_changed_cb themeCallback();
 

@@ -108,3 +108,38 @@ TEST_F(Guard, StandsBeforeTheEndOfAMovement) {
     EXPECT_THAT(newErrors(), ElementsAre(error(pager_log::file, "__pageScrollStopCb", titleCall)));
     EXPECT_EQ(pageInView(), 1);
 }
+
+/// What is called for nothing says so in the log, and does nothing.
+class CallWithoutData : public Guard {
+protected:
+    /// The theme's signal, as the page's layout would hear it.
+    static void signal(const char* name) { calls::signalCallback(name)(nullptr, nullptr, name, ""); }
+    static kest_log::Line noData(const std::string& file, const std::string& function) {
+        return kest_log::error(file, function, "data is null");
+    }
+};
+
+TEST_F(CallWithoutData, OfTheReplyButtonIsAnErrorLine) {
+    openAtRest();
+    signal("reply,pressed");
+    signal("reply,uppressed");
+    EXPECT_THAT(newErrors(), ElementsAre(noData(demonstrationFile, "__sequencePressedCb"),
+                                         noData(demonstrationFile, "__sequenceReleasedCb")));
+    EXPECT_THAT(calls::story(), IsEmpty());
+}
+
+TEST_F(CallWithoutData, OfTheReplyButtonOfATallPictureIsAnErrorLine) {
+    openTallAtRest();
+    signal("reply,pressed");
+    signal("reply,uppressed");
+    EXPECT_THAT(newErrors(), ElementsAre(noData(demonstrationFile, "__tallPressedCb"),
+                                         noData(demonstrationFile, "__tallReleasedCb")));
+    EXPECT_THAT(calls::story(), IsEmpty());
+}
+
+TEST_F(CallWithoutData, OfALinkIsAnErrorLine) {
+    openAtRest();
+    calls::smartCallback("anchor,clicked")(nullptr, nullptr, nullptr);
+    EXPECT_THAT(newErrors(), ElementsAre(noData(pager_log::pageFile, "operator()")));
+    EXPECT_THAT(device()->launches().all(), IsEmpty());
+}

@@ -211,9 +211,11 @@ TEST_F(PictureArea, OfASequenceIsPagedByNoFinger) {
     Eina_Bool horizontalBounce = EINA_TRUE, verticalBounce = EINA_TRUE;
     elm_scroller_bounce_get(scroller, &horizontalBounce, &verticalBounce);
     EXPECT_FALSE(horizontalBounce || verticalBounce);
-    int limit = 0;
-    elm_scroller_page_scroll_limit_get(scroller, &limit, nullptr);
-    EXPECT_EQ(limit, 1);
+    int horizontalLimit = 0, verticalLimit = 1;
+    elm_scroller_page_scroll_limit_get(scroller, &horizontalLimit, &verticalLimit);
+    EXPECT_EQ(horizontalLimit, 1);
+    const int noLimit = 9999;  // what a scroller makes of 0
+    EXPECT_EQ(verticalLimit, noLimit);
 }
 
 TEST_F(PictureArea, OfASequenceStaysWhereItIsBelowAFingerThatMovesUpOrDown) {

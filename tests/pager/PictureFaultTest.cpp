@@ -3,12 +3,32 @@
 #include "KestContentMgr.h"
 #include "KestPaths.h"
 
+#include <dlfcn.h>
 #include <sys/stat.h>
 
 namespace fs = std::filesystem;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::Not;
+
+namespace {
+
+/// The heights of the pictures that were set to be decoded by a thread.
+std::vector<int> decoded;
+
+}  // namespace
+
+/// The program's definition comes before the library's own, also for the other libraries.
+extern "C" __attribute__((visibility("default"))) void evas_object_image_preload(Evas_Object* image, Eina_Bool cancel) {
+    static const auto own =
+        reinterpret_cast<decltype(&evas_object_image_preload)>(dlsym(RTLD_NEXT, "evas_object_image_preload"));
+    int height = 0;
+    evas_object_image_size_get(image, nullptr, &height);
+    if (!cancel)
+        decoded.push_back(height);
+    own(image, cancel);
+}
 
 /// Pictures that are not what they ought to be. The page stays usable.
 class PictureFault : public PictureTest {
@@ -148,6 +168,18 @@ TEST_F(PictureFault, TwentyThousandPixelsHighTakesNoMemory) {
     test_ui::runFor(2);
     ASSERT_EQ(pageInView(), 1);
     EXPECT_LT(memory(), before + 20 * 1024 * 1024);
+}
+
+TEST_F(PictureFault, TwentyThousandPixelsHighIsNotEvenBegunToBeDecoded) {
+    drawPicture("a_01.png", 716, 20000);
+    drawPicture("b_01.png", 716, 370);
+    writeTips({tip("b_01.png"), tip("a_01.png")});
+    open();
+    swipe();
+    test_ui::runFor(2);
+    ASSERT_EQ(pageInView(), 1);
+    EXPECT_THAT(decoded, Contains(370));
+    EXPECT_THAT(decoded, Not(Contains(20000)));
 }
 
 TEST_F(PictureFault, OfTooManyPixelsShowsThePlaceholderInItsPlaceInASequence) {

@@ -27,6 +27,15 @@ TEST_F(PictureVariant, ForRussianIsOfNoUseToOthers) {
     EXPECT_EQ(fileIn(video(), "page"), picture);
 }
 
+TEST_F(PictureVariant, ForRussianIsOfNoUseToRussianOfAnotherCountry) {
+    const std::string picture = drawPicture("a_01.png");
+    drawPicture("a_russia_01.png");
+    device()->settings().set(device::keys::language, "ru_UA.UTF-8");
+    openPage();
+    EXPECT_EQ(fileIn(video(), "page"), picture);
+    EXPECT_THAT(buildLog(), Contains(info("isRussian", "locale = ru_UA")));
+}
+
 TEST_F(PictureVariant, ForRussianNeedNotBeThere) {
     const std::string picture = drawPicture("a_01.png");
     useRussian();
@@ -113,6 +122,7 @@ TEST_F(PictureVariant, OfALowDensityDisplayIsATallPicture138PixelsLower) {
     drawPicture("a_01.png", 716, 1000);
     useSmallScreen();
     openPage();
+    EXPECT_EQ(groupOf(elm_object_content_get(pictureScroller())), "layout/multi_image/page") << "for a tall one always";
     // 1000 at 478 of 716 pixels' width are 667.
     EXPECT_EQ(sizeOf(elm_object_content_get(pictureScroller())), (Size{-1, 667 - 138}));
 }

@@ -3,6 +3,8 @@
 #include <device/Faults.h>
 #include <notification.h>
 
+#include <algorithm>
+
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -97,6 +99,30 @@ TEST_F(NotificationTest, OpensTheTipThatIsAskedForTogetherWithIt) {
     EXPECT_EQ(posted().size(), 1U);
     EXPECT_THAT(usage(), ElementsAre("KT03 Clock"));
     EXPECT_THAT(views(), Contains("KestContentView"));
+}
+
+TEST_F(NotificationTest, IsMadeBeforeTheTipIsLookedFor) {
+    writeCatalogue();
+    start({"LaunchingType=addNoti", std::string("appID=") + clockId});
+    const std::vector<kest_log::Line> lines = newLines();
+    const auto made = std::ranges::find(lines, info("__setNotificationLaunch", "app_control_create success"));
+    const auto lookedFor = std::ranges::find(lines, RequestTest::info(std::string("Appcontrol case from ") + clockId));
+    ASSERT_NE(lookedFor, lines.end());
+    EXPECT_LT(made, lookedFor);
+}
+
+TEST_F(NotificationTest, IsMadeToItsEndWhateverElseIsRefused) {
+    drawIcon();
+    for (const char* service : {"notification_set_layout", "notification_set_text", "notification_set_display_applist"})
+        device::faults::plan(service, NOTIFICATION_ERROR_OUT_OF_MEMORY, 2);
+    // The first one is that of the request that was received.
+    device::faults::plan("app_control_set_app_id", APP_CONTROL_ERROR_OUT_OF_MEMORY, 1, 1);
+    start(asked_);
+    const std::vector<std::string> made = calls::madeOf(
+        {"notification_set_layout", "notification_set_text", "notification_set_image", "notification_set_launch",
+         "notification_set_display", "notification_post", "notification_free"});
+    EXPECT_THAT(made, SizeIs(9));
+    EXPECT_EQ(made.back(), "notification_free");
 }
 
 TEST_F(NotificationTest, IsNotPostedForAnotherWord) {

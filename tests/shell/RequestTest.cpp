@@ -3,6 +3,7 @@
 #include "ui/Transitions.h"
 
 #include <app-assist/WWindow.h>
+#include <device/Faults.h>
 
 #include <algorithm>
 #include <map>
@@ -97,6 +98,24 @@ TEST_F(RequestTest, ShowsTheListWhereItNamesNoApplication) {
     EXPECT_THAT(views(), ElementsAre("KestMainView"));
     EXPECT_THAT(usage(), IsEmpty());
     EXPECT_THAT(newLines(), IsSupersetOf({begin(), missing("addNoti"), missing("appID")}));
+}
+
+TEST_F(RequestTest, ShowsTheListWhereItsWordsCannotBeRead) {
+    writeCatalogue();
+    device::faults::plan("app_control_get_extra_data", APP_CONTROL_ERROR_OUT_OF_MEMORY, 2);
+    start({"LaunchingType=addNoti", std::string("appID=") + clockId});
+    EXPECT_THAT(views(), ElementsAre("KestMainView"));
+    EXPECT_THAT(newLines(), IsSupersetOf({begin(), missing("addNoti"), missing("appID")}));
+    EXPECT_THAT(device()->notifications().all(), IsEmpty());
+    EXPECT_FALSE(test_ui::hasEnded());
+}
+
+TEST_F(RequestTest, OpensTheFirstTipWhereItsPageCannotBeRead) {
+    writeCatalogue();
+    device::faults::plan("app_control_get_extra_data", APP_CONTROL_ERROR_OUT_OF_MEMORY, 1, 2);
+    start({std::string("appID=") + doorId, "page=3"});
+    EXPECT_THAT(usage(), ElementsAre("KT03 Open", "KT03 Close", "KT03 Lock"));
+    EXPECT_THAT(newLines(), Contains(missing("page")));
 }
 
 TEST_F(RequestTest, ShowsTheListWhereTheApplicationIsNamedByAnEmptyText) {

@@ -212,7 +212,8 @@ void Runtime::deliver(const LaunchRequest::Extras& extras) {
     app_.onAppControl(request.handle(), first);
     if (first)
         app_.beginSight();
-    else
+    // Until the bus brings the request that it started the application for, another window may have come to the front.
+    if (!first || words_.comesOverTheBus)
         raiseWindow();
 }
 

@@ -47,7 +47,8 @@ protected:
     /// first launch request, out of sight before onTerminate.
     virtual void onPause();
     virtual void onResume();
-    /// A launch request, of which the first started the application; after a later one its window is raised.
+    /// A launch request, of which the first started the application; after a later one, and after one for which the bus
+    /// started it, its window is raised.
     /// `request` is freed by the framework afterwards.
     virtual void onAppControl(app_control_h request, bool firstLaunch);
 
