@@ -215,6 +215,10 @@ void KestContentView::__backCb(void* data, Evas_Object*, void*) {
 void KestContentView::__pageScrollStartCb(void* data, Evas_Object*, void*) try {
     KEST_HIT();
     auto* view = static_cast<KestContentView*>(data);
+    if (!view) {
+        KEST_ERR("data is null");
+        return;
+    }
     view->displayed = noMenu;
     for (std::int32_t menu = 0; menu < view->pageCount; ++menu) {
         if (KestContentSubView* page = view->__pageAt(menu)) {
@@ -228,6 +232,10 @@ void KestContentView::__pageScrollStartCb(void* data, Evas_Object*, void*) try {
 void KestContentView::__pageScrollStopCb(void* data, Evas_Object*, void*) try {
     KEST_HIT();
     auto* view = static_cast<KestContentView*>(data);
+    if (!view) {
+        KEST_ERR("data is null");
+        return;
+    }
     view->__display(view->__menuInView(), view->getNaviItem());
 } catch (const std::exception& error) {
     KEST_ERR("%s", error.what());

@@ -90,6 +90,15 @@ TEST_F(Detail, ReadsTheFirstItemsOnly) {
     EXPECT_EQ(record.appName, "");
 }
 
+TEST_F(Detail, ReadsNothingThatLiesDeeper) {
+    const KestContentInfo record =
+        loadFile("<tip><old><items><item><title>Old</title></item></items></old><items><item><appname>Name</appname>"
+                 "<group><title>Grouped</title></group></item><group><item><title>Grouped</title></item></group>"
+                 "</items></tip>");
+    EXPECT_EQ(record.menuTitle, "No Title");
+    EXPECT_EQ(record.appName, "Name");
+}
+
 TEST_F(Detail, ReadsEveryItemIntoTheSameRecord) {
     const KestContentInfo record =
         loadFile("<tip><items>text<item><title>First</title><appname>Name</appname></item><other/>"

@@ -60,6 +60,14 @@ TEST_F(MainMenu, ReadsTheFirstMenusElementOnly) {
     EXPECT_THAT(loadedPaths(), ElementsAre("contents/a.xml"));
 }
 
+TEST_F(MainMenu, TakesNothingThatLiesDeeper) {
+    for (const char* path : {"contents/a.xml", "contents/b.xml", "contents/c.xml"})
+        menu(path);
+    writeMainMenu("<tips><old><menus>" + Menu{"contents/a.xml"}.xml() + "</menus></old><menus><group>" +
+                  Menu{"contents/b.xml"}.xml() + "</group>" + Menu{"contents/c.xml"}.xml() + "</menus></tips>");
+    EXPECT_THAT(loadedPaths(), ElementsAre("contents/c.xml"));
+}
+
 TEST_F(MainMenu, IgnoresUnknownChildrenOfAMenu) {
     menu("contents/a.xml");
     writeMainMenu(mainMenu("<menu>text<colour>red</colour><path>contents/a.xml</path><!-- c --><appid>" + kest +

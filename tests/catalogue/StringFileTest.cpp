@@ -167,6 +167,17 @@ TEST_F(StringFile, ReadsTheFirstItemsOnlyAndSkipsOtherChildren) {
     EXPECT_EQ(titleOf("IDS_B"), "untranslated");
 }
 
+TEST_F(StringFile, TakesNothingThatLiesDeeper) {
+    const auto item = [](const std::string& id) {
+        return "<item><region>en_US</region><stringid>" + id + "</stringid><value>" + id + " found</value></item>";
+    };
+    writeFile("<strings><old><items>" + item("IDS_A") + "</items></old><items><group>" + item("IDS_B") + "</group>" +
+              item("IDS_C") + "</items></strings>");
+    EXPECT_EQ(titleOf("IDS_A"), "untranslated");
+    EXPECT_EQ(titleOf("IDS_B"), "untranslated");
+    EXPECT_EQ(titleOf("IDS_C"), "IDS_C found");
+}
+
 TEST_F(StringFile, MayLackItems) {
     writeFile("<strings><other/></strings>");
     EXPECT_EQ(titleOf("IDS_MINE"), "untranslated");

@@ -102,6 +102,12 @@ TEST_F(TextTag, EndsAtTheFirstEnd) {
     EXPECT_EQ(loadContents("<text id=\"IDS_SYSTEM\"><text id=\"IDS_OWN\">a</text></text>"), "System text</text>");
 }
 
+TEST_F(TextTag, OfTheApplicationsIsFoundAfterOneOfTheSystemsInATipOfTheApplicationsDomain) {
+    // A text that the domain does not have leaves it bound to the system's folder.
+    const std::string contents = kest_files::contents(textTag("IDS_SYSTEM") + "-" + textTag("IDS_OWN"));
+    EXPECT_EQ(loadTip("<textdomain>kest</textdomain>" + contents).textContents, "System text-Own text");
+}
+
 TEST_F(TextTag, HasItsLineBreaksMadeSmall) {
     EXPECT_EQ(loadValue("a\nb"), "a" + lineBreak + "b");
     EXPECT_EQ(loadValue("a\\nb"), "a" + lineBreak + "b");

@@ -11,6 +11,23 @@ using testing::Pair;
 using Type = device::PackageEvent::Type;
 using State = device::PackageEvent::State;
 
+namespace {
+
+/// Has the main loop always something to do.
+class BusyLoop {
+public:
+    BusyLoop() { again(this); }
+    ~BusyLoop() { ecore_job_del(job_); }
+    BusyLoop(const BusyLoop&) = delete;
+    BusyLoop& operator=(const BusyLoop&) = delete;
+
+private:
+    static void again(void* data) { static_cast<BusyLoop*>(data)->job_ = ecore_job_add(again, data); }
+    Ecore_Job* job_ = nullptr;
+};
+
+}  // namespace
+
 /// What changes on the device while the list is shown, or lies beneath the pager.
 class Change : public ListTest {
 protected:
@@ -43,6 +60,15 @@ TEST_F(Change, OfTheLanguageRefreshesTheTexts) {
     EXPECT_THAT(menuTexts(), ElementsAre(Pair("자체 텍스트", "내 것")));
     EXPECT_EQ(text(titleRow(), "elm.text.main"), "팁 및 안내");
     EXPECT_EQ(text(naviframe().getTopView()->getNaviItem(), "elm.text.title"), "팁");
+}
+
+TEST_F(Change, OfTheLanguageRefreshesTheTextsOfALoopThatIsNeverIdle) {
+    writeTranslatedTip();
+    start();
+    const BusyLoop busy;
+    setLanguage("ko_KR.UTF-8");
+    test_ui::runFor(0.01);
+    EXPECT_THAT(menuTexts(), ElementsAre(Pair("자체 텍스트", "내 것")));
 }
 
 TEST_F(Change, OfTheLanguageKeepsTheRows) {

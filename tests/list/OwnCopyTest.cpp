@@ -32,6 +32,15 @@ TEST_F(OwnCopy, IsWhatTheRowsShow) {
     EXPECT_THAT(menuTexts(), ElementsAre(Pair("Name of A", "A"), Pair("Name of B", "B")));
 }
 
+TEST_F(OwnCopy, IsWhoseIconsTheRowsShow) {
+    startWith({"A"});
+    writeMenus({{"contents/fallback.xml", ""}});
+    reloadTheCatalogueAlone();
+    ASSERT_EQ(KestContentMgr::getInstance()->getContentsList().at(0).iconPath, "");
+    drawRowsAnew();
+    EXPECT_NE(elm_object_item_part_content_get(menuRow(0), "elm.icon.1"), nullptr);
+}
+
 TEST_F(OwnCopy, IsWhatATapWritesDown) {
     startWith({"A", "B", "C"});
     writeTips({"X"});

@@ -137,6 +137,15 @@ TEST_F(CallWithoutData, OfTheReplyButtonOfATallPictureIsAnErrorLine) {
     EXPECT_THAT(calls::story(), IsEmpty());
 }
 
+TEST_F(CallWithoutData, OfAMovementsBeginningAndEndIsAnErrorLine) {
+    openAtRest();
+    calls::smartCallback("scroll,anim,start")(nullptr, nullptr, nullptr);
+    calls::smartCallback("scroll,anim,stop")(nullptr, nullptr, nullptr);
+    EXPECT_THAT(newErrors(), ElementsAre(noData(pager_log::file, "__pageScrollStartCb"),
+                                         noData(pager_log::file, "__pageScrollStopCb")));
+    EXPECT_THAT(calls::story(), IsEmpty());
+}
+
 TEST_F(CallWithoutData, OfALinkIsAnErrorLine) {
     openAtRest();
     calls::smartCallback("anchor,clicked")(nullptr, nullptr, nullptr);

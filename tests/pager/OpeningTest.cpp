@@ -216,6 +216,10 @@ TEST_F(Opening, WithoutAnyMenuShowsNoPage) {
     settle();
     EXPECT_EQ(pager().getPageCount(), 0);
     EXPECT_EQ(topView(), "KestContentView");
+    EXPECT_EQ(title(), "");
+    push(0, false);
+    settle();
+    EXPECT_EQ(title(), "");
     EXPECT_THAT(newErrors(), IsEmpty());
 }
 

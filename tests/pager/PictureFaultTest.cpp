@@ -50,6 +50,13 @@ TEST_F(PictureFault, MissingShowsThePlaceholder) {
     expectUsablePage();
 }
 
+TEST_F(PictureFault, MissingAsTheFirstOfASequenceShowsThePlaceholder) {
+    drawPicture("a_02.png");
+    openPage();
+    EXPECT_TRUE(showsPlaceholder());
+    expectUsablePage();
+}
+
 TEST_F(PictureFault, NoImageElementShowsThePlaceholder) {
     writeTips({"<title>Title</title>" + kest_files::contents("Text")});
     open();

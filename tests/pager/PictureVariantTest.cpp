@@ -53,6 +53,14 @@ TEST_F(PictureVariant, ForRussianIsLookedForPictureByPicture) {
     EXPECT_THAT(filesIn(pictures(), "page.touch"), ElementsAre("", picturePath("a_02_touch.png"), ""));
 }
 
+TEST_F(PictureVariant, ForRussianAloneGoesOnWithNoSequence) {
+    drawSequence(2);
+    drawPicture("a_russia_03.png");
+    useRussian();
+    openPage();
+    EXPECT_THAT(filesIn(pictures()), ElementsAre(picturePath("a_01.png"), picturePath("a_02.png")));
+}
+
 TEST_F(PictureVariant, ForRussianIsNoFolderThatTheCutPathNames) {
     const std::string picture = drawPicture("a01.png");
     ASSERT_EQ(picture.find('_'), std::string::npos);
@@ -125,6 +133,20 @@ TEST_F(PictureVariant, OfALowDensityDisplayIsATallPicture138PixelsLower) {
     EXPECT_EQ(groupOf(elm_object_content_get(pictureScroller())), "layout/multi_image/page") << "for a tall one always";
     // 1000 at 478 of 716 pixels' width are 667.
     EXPECT_EQ(sizeOf(elm_object_content_get(pictureScroller())), (Size{-1, 667 - 138}));
+}
+
+TEST_F(PictureVariant, IsDrawnByTheThemesFileOfTheDisplaysDensityAsTheWholePageIs) {
+    drawPicture("a_01.png");
+    const auto theme = device().appRoot() / "res/LDPI/edje/kest.edj";
+    std::filesystem::create_directories(theme.parent_path());
+    std::filesystem::copy_file(device().appRoot() / "res/edje/kest.edj", theme);
+    device()->settings().set(device::keys::screen, "480x800");
+    openPage();
+    for (Evas_Object* layout : {page(), video(), infoLayout()}) {
+        const char* file = nullptr;
+        elm_layout_file_get(layout, &file, nullptr);
+        EXPECT_STREQ(file, theme.c_str()) << groupOf(layout);
+    }
 }
 
 TEST_F(PictureVariant, OfASmallDisplayWithoutResourcesOfItsOwnIsATallPictureWhole) {

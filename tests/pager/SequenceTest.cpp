@@ -122,6 +122,29 @@ TEST_F(Sequence, BehavesTheSameAtEveryReplay) {
     EXPECT_THAT(first, testing::Contains("8.0 pictures to page 0"));
 }
 
+TEST_F(Sequence, ThatSomethingBroughtBackGoesOnFromThere) {
+    play(3, {}, 3);
+    ASSERT_EQ(pictureInView(), 1);
+    elm_scroller_page_show(pictureScroller(), 0, 0);
+    calls::forget();
+    test_ui::runFor(20);
+    EXPECT_THAT(calls::story(),
+                ElementsAre("1.0 pictures to page 1", "3.0 pictures to page 2", "5.0 pictures to page 0",
+                            "5.0 picture 0 touch,hide", "5.0 picture 1 touch,hide", "5.0 area reply,show"));
+}
+
+TEST_F(Sequence, OfMarkedPicturesThatSomethingBroughtBackShowsTheMarkerThatIsInView) {
+    play(3, {0, 1}, 3.5);
+    ASSERT_EQ(pictureInView(), 1);
+    elm_scroller_page_show(pictureScroller(), 0, 0);
+    calls::forget();
+    test_ui::runFor(20);
+    EXPECT_THAT(calls::story(),
+                ElementsAre("0.5 picture 0 touch,show", "2.5 pictures to page 1", "3.5 picture 1 touch,show",
+                            "5.5 pictures to page 2", "7.5 pictures to page 0", "7.5 picture 0 touch,hide",
+                            "7.5 picture 1 touch,hide", "7.5 area reply,show"));
+}
+
 TEST_F(Sequence, OnAnotherPageWaitsUntilThatIsDisplayed) {
     drawSequence(2);
     drawPicture("plain.png");

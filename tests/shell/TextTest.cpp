@@ -6,6 +6,8 @@
 
 #include <gmock/gmock.h>
 
+#include <libintl.h>
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Pair;
@@ -24,6 +26,11 @@ TEST_F(Text, OfTheApplicationsOwnIsFoundThere) {
     EXPECT_EQ(KestCommon::findProperDomain("IDS_OWN"), "kest");
     EXPECT_EQ(KestCommon::translateString("IDS_OWN"), "Own text");
     EXPECT_THAT(log(), IsEmpty());
+}
+
+TEST_F(Text, OfTheApplicationsOwnIsFoundAfterATipThatLeftItsDomainInTheSystemsFolder) {
+    bindtextdomain("kest", "/usr/share/locale");
+    EXPECT_EQ(KestCommon::translateString("IDS_OWN"), "Own text");
 }
 
 TEST_F(Text, OfNobodyElsesIsLookedForInContacts) {
