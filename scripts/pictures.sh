@@ -4,7 +4,7 @@
 # shellcheck disable=SC2034
 screens=(720x1280 480x800)
 # shellcheck disable=SC2034
-languages=(en_US ko_KR ru_RU de_DE hi_IN id_ID ar_AE zh_CN)
+mapfile -t languages < <(basename -a res/locale/*/)
 
 # own_device [BUILD FOLDER]: has $tool run a device of its own, so that one that runs is left alone. It and $scratch,
 # a folder for what lies about, go when the command ends.

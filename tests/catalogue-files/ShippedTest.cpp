@@ -134,9 +134,9 @@ TEST(ShippedCatalogue, OffersTipsInEveryRegion) {
     const auto onlyIn = [&](const std::string& region) {
         return std::count_if(tips.begin(), tips.end(), [&](const Tip& tip) { return tip.state == region; });
     };
-    EXPECT_EQ(1, onlyIn("India"));
-    EXPECT_EQ(1, onlyIn("Russia"));
-    EXPECT_EQ(1, onlyIn("Global"));
+    EXPECT_GE(onlyIn("India"), 1);
+    EXPECT_GE(onlyIn("Russia"), 1);
+    EXPECT_GE(onlyIn("Global"), 1);
 }
 
 TEST(ShippedCatalogue, HasOneTipThatWaitsForItsApplication) {

@@ -88,7 +88,7 @@ INSTANTIATE_TEST_SUITE_P(Texts, Domain,
 
 TEST(Texts, OfTheApplicationAndTheDeviceHaveTheSameLanguages) {
     EXPECT_THAT(languagesIn(DEVICE_TEXTS),
-                ElementsAre("ar_AE", "de_DE", "en_US", "hi_IN", "id_ID", "ko_KR", "ru_RU", "zh_CN"));
+                testing::IsSupersetOf({"ar_AE", "de_DE", "en_US", "hi_IN", "id_ID", "ko_KR", "ru_RU", "zh_CN"}));
     EXPECT_EQ(languagesIn(DEVICE_TEXTS), languagesIn(APPLICATION_TEXTS));
 }
 

@@ -82,6 +82,12 @@ TEST_F(Detail, MayLackItems) {
     EXPECT_THAT(log(), testing::Contains(hit("__saveToPreference")));
 }
 
+TEST_F(Detail, MayHaveNothingButATextInItsRoot) {
+    EXPECT_EQ(loadFile("<tip>text</tip>").menuTitle, "No Title");
+    EXPECT_EQ(preference("contents_tip.xml_menuTitle"), "No Title");
+    EXPECT_THAT(errors(), IsEmpty());
+}
+
 TEST_F(Detail, ReadsTheFirstItemsOnly) {
     const KestContentInfo record =
         loadFile("<tip><other/><items><item><title>First</title></item></items>"
@@ -105,6 +111,25 @@ TEST_F(Detail, ReadsEveryItemIntoTheSameRecord) {
                  "<item><title>Second</title></item></items></tip>");
     EXPECT_EQ(record.menuTitle, "Second");
     EXPECT_EQ(record.appName, "Name");
+}
+
+TEST_F(Detail, TakesOfEveryElementTheLastOfAllItems) {
+    const auto item = [](const std::string& number) {
+        return "<item><textdomain>tips" + number + "</textdomain><title id=\"IDS_OWN" + number +
+               "\">x</title><appname>Name " + number + "</appname><image>" + number +
+               ".png</image><launchappid>com.example.app" + number + "</launchappid><launchparamkey>key " + number +
+               "</launchparamkey><launchparamvalue>value " + number + "</launchparamvalue></item>";
+    };
+    writeStrings({{"en", "IDS_OWN1", "First"}, {"en", "IDS_OWN2", "Second"}});
+    const KestContentInfo record = loadFile("<tip><items>" + item("1") + item("2") + "</items></tip>");
+    EXPECT_EQ(record.textdomain, "tips2");
+    EXPECT_EQ(record.menuTitle, "Second");
+    EXPECT_EQ(record.titleId, "IDS_OWN2");
+    EXPECT_EQ(record.appName, "Name 2");
+    EXPECT_EQ(record.imagePath, (resources() / "2.png").string());
+    EXPECT_EQ(record.launchAppid, "com.example.app2");
+    EXPECT_EQ(record.launchParamKey, "key 2");
+    EXPECT_EQ(record.launchParamValue, "value 2");
 }
 
 TEST_F(Detail, IgnoresUnknownElements) {

@@ -104,6 +104,17 @@ TEST_F(MainMenu, StartsEveryMenuAfresh) {
     EXPECT_THAT(loadedPaths(), ElementsAre("contents/a.xml"));
 }
 
+TEST_F(MainMenu, StartsEveryMenuWithoutPathAndApplication) {
+    menu("contents/a.xml");
+    writeMainMenu(mainMenu(Menu{"contents/a.xml", kest}.xml() +
+                           "<menu><path>contents/fallback.xml</path><state>Global</state></menu>"
+                           "<menu><appid>com.example.other</appid><state>Global</state></menu>"));
+    const auto records = load();
+    ASSERT_THAT(paths(records), ElementsAre("contents/a.xml", "contents/fallback.xml", ""));
+    EXPECT_EQ(records[1].appid, "");
+    EXPECT_EQ(records[2].appid, "com.example.other");
+}
+
 TEST_F(MainMenu, DropsNokInEveryRegionWithoutALine) {
     writeMenus({menu("contents/a.xml", "NOK")});
     for (const char* country : {"KR", "IN", "RU", "ID", "NP", "ZA"}) {
@@ -188,6 +199,13 @@ TEST_F(MainMenu, MayHaveNoMenusElement) {
     EXPECT_TRUE(result());
     EXPECT_THAT(errors(), IsEmpty());
     EXPECT_THAT(warnings(), IsEmpty());
+}
+
+TEST_F(MainMenu, MayHaveNothingButABlankInItsRoot) {
+    writeMainMenu("<tips>\n</tips>");
+    EXPECT_THAT(load(), IsEmpty());
+    EXPECT_TRUE(result());
+    EXPECT_THAT(errors(), IsEmpty());
 }
 
 TEST_F(MainMenu, MustBeThere) {

@@ -159,6 +159,21 @@ TEST_F(StringFile, StartsEveryEntryAfresh) {
     EXPECT_EQ(titleOf("IDS_B"), "");
 }
 
+TEST_F(StringFile, StartsEveryEntryWithoutRegionAndId) {
+    writeFile(
+        "<strings><items><item><region>en_US</region><stringid>IDS_A</stringid><value>A</value></item>"
+        "<item><stringid>IDS_B</stringid><value>B</value></item><item><region>en_US</region><value>C</value></item>"
+        "</items></strings>");
+    EXPECT_EQ(titleOf("IDS_A"), "A");
+    EXPECT_EQ(titleOf("IDS_B"), "untranslated");
+}
+
+TEST_F(StringFile, MayHaveNothingButATextInItsRoot) {
+    writeFile("<strings>text</strings>");
+    EXPECT_EQ(titleOf("IDS_MINE"), "untranslated");
+    EXPECT_THAT(errors(), IsEmpty());
+}
+
 TEST_F(StringFile, ReadsTheFirstItemsOnlyAndSkipsOtherChildren) {
     writeFile("<any><other/><items>text<other/><!-- c --><item><other>x</other><stringid>IDS_A</stringid>"
               "<value>A</value><region>en_US</region></item></items><items><item><region>en_US</region>"

@@ -15,6 +15,7 @@ namespace {
 struct View : KestMainView {
     using KestMainView::KestMainView;
     using KestMainView::onCreate;
+    using KestMainView::onDestroy;
     using KestMainView::onPushToNaviframe;
 };
 
@@ -37,6 +38,17 @@ TEST_F(Life, BeginsWithTheThemesFileAndNoRows) {
     EXPECT_THAT(calls::made().themeExtensions, ElementsAre((device().appRoot() / "res/edje/kest.edj").string()));
     EXPECT_THAT(calls::made().rows, IsEmpty());
     EXPECT_EQ(view.getEvasObj(), nullptr);
+}
+
+TEST_F(Life, HasNoRowsUntilItIsPushed) {
+    writeTips({"A"});
+    startEmpty();
+    View view(true);
+    Evas_Object* layout = view.onCreate(running().window(), nullptr);
+    EXPECT_NE(layout, nullptr);
+    EXPECT_THAT(calls::made().rows, IsEmpty());
+    evas_object_del(layout);
+    view.onDestroy();
 }
 
 TEST_F(Life, AddsTheThemesFileOnceForTwoViews) {

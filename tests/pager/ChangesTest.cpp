@@ -14,8 +14,8 @@ TEST_F(PagerChange, OfTheThemeRebuildsTheTitleOfEveryPage) {
     reload({titled("New A", "New"), titled("New B", "New")});
     setTheme("dark");
     settle();
-    EXPECT_THAT(shownTitle(0), HasSubstr("New A"));
-    EXPECT_THAT(shownTitle(1), HasSubstr("New B"));
+    EXPECT_EQ(test_ui::text(titleLabel(0)), titleMarkup(icon(), "New A"));
+    EXPECT_EQ(test_ui::text(titleLabel(1)), titleMarkup(icon(), "New B"));
     EXPECT_EQ(shownText(0), "Text");
 }
 
@@ -97,8 +97,22 @@ TEST_F(PagerChange, OfTheLanguageWritesTheTextsAnewHalfASecondLater) {
     test_ui::runFor(0.4);
     EXPECT_EQ(shownText(0), "Read this");
     test_ui::runFor(0.2);
-    EXPECT_EQ(shownText(0), "읽으세요");
-    EXPECT_EQ(shownText(1), "읽으세요");
+    for (const int page : {0, 1}) {
+        EXPECT_EQ(test_ui::text(entry(page)), textMarkup("읽으세요"));
+        EXPECT_EQ(test_ui::text(titleLabel(page)), titleMarkup(icon(), "내 것"));
+    }
+}
+
+TEST_F(PagerChange, OfTheLanguageToOneWithoutATextIsToldOf) {
+    writeTips({titled("A")});
+    openAtRest();
+    reload({"<title>A</title><contents></contents>"});
+    newLog();
+    setLanguage("ko_KR.UTF-8");
+    test_ui::runFor(1);
+    EXPECT_EQ(test_ui::text(entry(0)), "");
+    EXPECT_THAT(newLog(),
+                Contains(kest_log::info(pager_log::pageFile, "__setText", "contentList[0].textContents is empty")));
 }
 
 TEST_F(PagerChange, OfTheLanguageWritesThePageNumberAnew) {

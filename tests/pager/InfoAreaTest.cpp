@@ -14,12 +14,6 @@ protected:
         writeTips({item});
         open();
     }
-    std::string icon() const { return device()->packages().find(kest)->icon; }
-    static std::string titleMarkup(const std::string& icon, const std::string& title) {
-        return "<align=center><item size=62x62 vsize=full href=file:/" + icon +
-               "></item>  <color=#000000><font_weight='Regular'><font_width='condensed'><font_size=46>" + title +
-               "</font_size></font_width></font_weight></color></align>";
-    }
     static kest_log::Line isEmpty(int index) {
         return kest_log::info("KestContentSubView.cpp", "__setText",
                               "contentList[" + std::to_string(index) + "].textContents is empty");
@@ -34,8 +28,7 @@ TEST_F(InfoArea, ShowsTheTipsIconAndTitle) {
 
 TEST_F(InfoArea, ShowsTheText) {
     openTip(tip("a_01.png", "Open <a href=app>Clock</a>."));
-    EXPECT_EQ(test_ui::text(entry()),
-              "<font_style='Regular' font_size=36 align=left linegap=10>Open <a href=app>Clock</a>.</>");
+    EXPECT_EQ(test_ui::text(entry()), textMarkup("Open <a href=app>Clock</a>."));
     EXPECT_EQ(test_ui::plainText(entry()), "Open Clock.");
 }
 

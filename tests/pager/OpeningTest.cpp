@@ -181,8 +181,16 @@ TEST_F(Opening, HasABackButtonThatClosesIt) {
     EXPECT_STREQ(elm_object_style_get(back), "naviframe/back_btn/default");
     EXPECT_EQ(test_ui::text(back), "");
     screen().tap(back);
-    settle();
+    EXPECT_EQ(transitions(), 1);
     EXPECT_EQ(topView(), "OtherView");
+}
+
+TEST_F(Opening, IsLaidOutAsAnApplicationsWholeView) {
+    writeTipsOfNumber(2);
+    open();
+    const char* group = nullptr;
+    edje_object_file_get(elm_layout_edje_get(pager().getEvasObj()), nullptr, &group);
+    EXPECT_STREQ(group, "elm/layout/application/default");
 }
 
 TEST_F(Opening, HasABackButtonThatNeedsItsView) {

@@ -143,6 +143,16 @@ std::vector<kest_log::Line> PagerTest::newLogOf(const std::string& file) {
     return found;
 }
 
+std::string PagerTest::titleMarkup(const std::string& icon, const std::string& title) {
+    return "<align=center><item size=62x62 vsize=full href=file:/" + icon +
+           "></item>  <color=#000000><font_weight='Regular'><font_width='condensed'><font_size=46>" + title +
+           "</font_size></font_width></font_weight></color></align>";
+}
+
+std::string PagerTest::textMarkup(const std::string& text) {
+    return "<font_style='Regular' font_size=36 align=left linegap=10>" + text + "</>";
+}
+
 std::string PagerTest::fileOf(const Evas_Object* image) {
     const char* file = nullptr;
     elm_image_file_get(image, &file, nullptr);

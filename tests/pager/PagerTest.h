@@ -87,6 +87,11 @@ protected:
 
     static std::string fileOf(const Evas_Object* image);
 
+    /// What a page's title line and its text are made of.
+    std::string icon() const { return device()->packages().find(kest)->icon; }
+    static std::string titleMarkup(const std::string& icon, const std::string& title);
+    static std::string textMarkup(const std::string& text);
+
     bool isDrawn_ = false;  ///< true: each frame is drawn, for tests of what drawing takes
 
 private:

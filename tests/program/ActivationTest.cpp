@@ -51,7 +51,7 @@ protected:
 TEST_F(StartedByTheBus, ShowsTheTipThatItIsLaunchedFor) {
     EXPECT_EQ(ask(device::bus::applicationInterface, "Launch", {BusClient::texts({{"appID", clockId}, {"page", "1"}})}),
               "");
-    expectTipAboveTheList(1);
+    expectTipAboveTheList(clockMenu_);
 }
 
 TEST_F(StartedByTheBus, ShowsTheListWhenItIsActivated) {
@@ -62,7 +62,7 @@ TEST_F(StartedByTheBus, ShowsTheListWhenItIsActivated) {
 
 TEST_F(StartedByTheBus, ShowsTheTipOfALink) {
     EXPECT_EQ(ask(desktopInterface, "Open", {BusClient::list({"kest:com.ravella.clock?page=1"}), noData_}), "");
-    expectTipAboveTheList(1);
+    expectTipAboveTheList(clockMenu_);
 }
 
 TEST_F(StartedByTheBus, OpensTheLastOfSeveralLinks) {
@@ -70,7 +70,7 @@ TEST_F(StartedByTheBus, OpensTheLastOfSeveralLinks) {
                   {BusClient::list({"kest:com.ravella.settings", "kest:com.ravella.clock"}), noData_}),
               "");
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 1);
+    EXPECT_EQ(pageInView(), clockMenu_);
     EXPECT_EQ(records().size(), 2U);
 }
 

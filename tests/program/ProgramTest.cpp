@@ -118,6 +118,11 @@ std::vector<std::string> menusOfferedIn(const std::string& region) {
     return menus;
 }
 
+int menuOf(const std::string& file, const std::string& region) {
+    const std::vector<std::string> menus = menusOfferedIn(region);
+    return static_cast<int>(std::ranges::find(menus, file) - menus.begin());
+}
+
 std::filesystem::path makeSleepPackage(const std::filesystem::path& where) {
     test_tool::makePackage(where, "com.ravella.sleep", "1.0");
     support::writeFile(where / "shared/res/contents/sleep_night.xml",

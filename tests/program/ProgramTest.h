@@ -46,6 +46,8 @@ protected:
 
 /// The detail files of the menus that the shipped catalogue offers in a region and whose application is installed.
 std::vector<std::string> menusOfferedIn(const std::string& region);
+/// The place of a detail file among them, counting from 0; their number when it is not there.
+int menuOf(const std::string& file, const std::string& region = "Global");
 
 /// A package of the application com.ravella.sleep, which no device has from the start but the catalogue has a tip
 /// about. Its title is "Sleep tight".

@@ -64,7 +64,7 @@ void RequestTest::expectTipAboveTheList(int menu) {
 
     device_.must({"key", "back"});
     EXPECT_THAT(views(), ElementsAre("KestMainView"));
-    EXPECT_THAT(records(), ElementsAre("KT03 " + titles()[static_cast<std::size_t>(menu)]));
+    EXPECT_THAT(records(), ElementsAre(recordInSight(menu)));
 
     EXPECT_EQ(device_.run({"key", "back"}), done("com.ravella.kest ended\n"));
 }
@@ -87,7 +87,7 @@ TEST_F(ColdRequest, ForNothingShowsTheList) {
 
 TEST_F(ColdRequest, ForATipShowsItWithTheListBeneath) {
     launchCold({clockTip});
-    expectTipAboveTheList(1);
+    expectTipAboveTheList(clockMenu_);
 }
 
 TEST_F(ColdRequest, ForSeveralTipsShowsEachWithOneListBeneath) {
@@ -98,13 +98,14 @@ TEST_F(ColdRequest, ForSeveralTipsShowsEachWithOneListBeneath) {
     device_.must({"key", "back"});
     device_.must({"key", "back"});
     EXPECT_THAT(views(), ElementsAre("KestMainView"));
-    EXPECT_THAT(records(), ElementsAre("KT03 " + titles()[8], "KT03 " + titles()[10]));
+    EXPECT_THAT(records(), ElementsAre(recordInSight(menuOf("contents/weather_tomorrow.xml", "India")),
+                                       recordInSight(menuOf("contents/weather_air.xml", "India"))));
 }
 
 TEST_F(ColdRequest, ForALaterTipOfAnApplicationShowsThatOne) {
     device_.must({"set", "country", "IN"});
     launchCold({"appID=com.ravella.weather", "page=2"});
-    expectTipAboveTheList(10);
+    expectTipAboveTheList(menuOf("contents/weather_air.xml", "India"));
 }
 
 TEST_F(ColdRequest, ForATipThatIsNotThereShowsNothingUntilALaterOneIs) {
@@ -139,7 +140,7 @@ TEST_F(ColdRequest, ThatComesDuringTheStartIsTheSecondOne) {
     EXPECT_EQ(launch({clockTip}).status, 0);
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
     device_.must({"key", "back"});
-    EXPECT_THAT(records(), testing::UnorderedElementsAre("KT03 " + titles()[1], "KT03 " + titles()[2]));
+    EXPECT_THAT(records(), testing::UnorderedElementsAre(recordInSight(clockMenu_), recordInSight(settingsMenu_)));
 }
 
 TEST_F(ColdRequest, OfAnotherApplicationFollowsTheOneInFront) {
@@ -163,8 +164,8 @@ TEST_F(WarmRequest, ForNothingLeavesWhatShows) {
 TEST_F(WarmRequest, ForATipShowsIt) {
     EXPECT_EQ(launch({clockTip}), handedOver());
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 1);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1)));
+    EXPECT_EQ(pageInView(), clockMenu_);
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_)));
     device_.must({"key", "back"});
     EXPECT_THAT(views(), ElementsAre("KestMainView"));
 }
@@ -173,16 +174,16 @@ TEST_F(WarmRequest, ForAnotherTipTurnsThePagerThatIsOpen) {
     EXPECT_EQ(launch({clockTip}), handedOver());
     EXPECT_EQ(launch({settingsTip}), handedOver());
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 2);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1), recordOf(2)));
+    EXPECT_EQ(pageInView(), settingsMenu_);
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_), recordOf(settingsMenu_)));
 }
 
 TEST_F(WarmRequest, TwiceInARowIsRecordedTwiceAndShownOnce) {
     EXPECT_EQ(launch({clockTip, "page=1"}), handedOver());
     EXPECT_EQ(launch({clockTip, "page=1"}), handedOver());
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 1);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1), recordOf(1)));
+    EXPECT_EQ(pageInView(), clockMenu_);
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_), recordOf(clockMenu_)));
 }
 
 TEST_F(WarmRequest, TwiceAtATimeShowsTheLastOne) {
@@ -191,8 +192,8 @@ TEST_F(WarmRequest, TwiceAtATimeShowsTheLastOne) {
     EXPECT_EQ(other.call(target(), "Launch", {BusClient::texts({{"appID", "com.ravella.settings"}})}), "");
     EXPECT_EQ(other.call(target(device::bus::screenInterface), "Settle"), "");
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 2);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1), recordOf(2)));
+    EXPECT_EQ(pageInView(), settingsMenu_);
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_), recordOf(settingsMenu_)));
 }
 
 TEST_F(WarmRequest, WhileAPagerMovesInTurnsIt) {
@@ -205,8 +206,9 @@ TEST_F(WarmRequest, WhileAPagerMovesInTurnsIt) {
     }
     EXPECT_EQ(other.call(target(device::bus::screenInterface), "Settle"), "");
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(pageInView(), 4);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1), recordOf(2), recordOf(3), recordOf(4)));
+    EXPECT_EQ(pageInView(), exerciseMenu_);
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_), recordOf(settingsMenu_), recordOf(heartrateMenu_),
+                                       recordOf(exerciseMenu_)));
 }
 
 TEST_F(WarmRequest, ForTheNotificationPostsItAndEnds) {

@@ -16,6 +16,11 @@ protected:
     static constexpr char clockId[] = "com.ravella.clock";
     static constexpr char clockTip[] = "appID=com.ravella.clock";
     static constexpr char settingsTip[] = "appID=com.ravella.settings";
+
+    const int clockMenu_ = menuOf("contents/clock_faces.xml");
+    const int settingsMenu_ = menuOf("contents/settings_palm.xml");
+    const int heartrateMenu_ = menuOf("contents/heartrate_measure.xml");
+    const int exerciseMenu_ = menuOf("contents/exercise_walk.xml");
     static constexpr char postNotification[] = "LaunchingType=addNoti";
 
     test_tool::Result launch(const std::vector<std::string>& extras = {}) {
@@ -38,6 +43,8 @@ protected:
     std::vector<std::string> views();
     /// The usage records, as "KT03 a tip's title".
     std::vector<std::string> records();
+    /// That of a request for the tip of the menu, counting from 0, while the list is in sight.
+    std::string recordInSight(int menu) { return "KT03 " + titles()[static_cast<std::size_t>(menu)]; }
     /// That the tip of the menu shows, counting from 0, with nothing but the list beneath, after one request for it;
     /// and that back leads to the list and out. The application has ended then.
     void expectTipAboveTheList(int menu);
@@ -56,7 +63,7 @@ protected:
         start();
         titles_ = titles();
     }
-    std::string recordOf(std::size_t menu) const { return "KT03 " + titles_[menu]; }
+    std::string recordOf(int menu) const { return "KT03 " + titles_[static_cast<std::size_t>(menu)]; }
     /// Of the device's own bus.
     std::string address() const {
         const std::string text = support::readFile(device_.root() / "bus.address");

@@ -51,13 +51,13 @@ TEST_F(SecondStart, HandsItsRequestOver) {
     EXPECT_EQ(startAgain({clockTip}), running());
     EXPECT_EQ(device_.run({"wait-for", "view=KestContentView"}), done());
     EXPECT_EQ(device_.application(), first);
-    EXPECT_THAT(records(), ElementsAre(recordOf(1)));
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_)));
 }
 
 TEST_F(SecondStart, HandsTheRequestOfALinkOver) {
     EXPECT_EQ(startAgain({"kest:com.ravella.clock?page=1"}), running());
     device_.must({"wait-for", "view=KestContentView"});
-    expectTipAboveTheList(1);
+    expectTipAboveTheList(clockMenu_);
 }
 
 TEST_F(SecondStart, WithALinkThatLeadsToNoTipIsRefused) {
@@ -83,7 +83,7 @@ TEST_F(SecondStart, TakesThePlaceOfTheFirstWhereThatEndsBeforeItsTurn) {
 
     EXPECT_EQ(device_.run({"wait-for", "view=KestContentView", "--app", app}), done()) << support::readFile(said());
     EXPECT_EQ(device_.application(), second.id());
-    EXPECT_THAT(records(), ElementsAre(recordOf(1)));
+    EXPECT_THAT(records(), ElementsAre(recordOf(clockMenu_)));
 }
 
 TEST_F(SecondStart, WithOddExtrasChangesNothing) {
@@ -112,7 +112,7 @@ TEST_F(SecondStart, WithAPageThatIsNoNumberOrLessThanOneShowsTheFirst) {
         EXPECT_EQ(startAgain({clockTip, page}), running()) << page;
     device_.must({"wait-for", "view=KestContentView"});
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));
-    EXPECT_EQ(records(), std::vector<std::string>(6, recordOf(1)));
+    EXPECT_EQ(records(), std::vector<std::string>(6, recordOf(clockMenu_)));
 }
 
 TEST_F(SecondStart, WithWhatIsNoTextOrTooMuchIsRefused) {

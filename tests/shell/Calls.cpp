@@ -18,6 +18,7 @@ std::vector<std::string> all;
 std::set<std::string> failing;
 bool rotationSupported = false;
 std::function<void()> lookWhenTheLanguageIsSet;
+std::function<void()> lookWhenARecordIsWritten;
 
 bool fails(const std::string& name) {
     return failing.count(name) > 0;
@@ -50,6 +51,10 @@ void calls::forget() {
 
 void calls::fail(const std::string& name) {
     failing.insert(name);
+}
+
+void calls::whenARecordIsWritten(std::function<void()> look) {
+    lookWhenARecordIsWritten = std::move(look);
 }
 
 void calls::whenTheLanguageIsSet(std::function<void()> look) {
@@ -138,6 +143,8 @@ CALL(int, ravella_log_manager_insert, ravella_log_manager_h handle, const char* 
      ravella_log_insert_cb callback, void* data, int* request) {
     note("ravella_log_manager_insert", uri, callback ? "callback" : "null", orNull(data, "data"),
          orNull(request, "number"));
+    if (lookWhenARecordIsWritten)
+        lookWhenARecordIsWritten();
     return __real_ravella_log_manager_insert(handle, uri, record, callback, data, request);
 }
 

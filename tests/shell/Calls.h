@@ -17,6 +17,8 @@ void forget();
 
 /// Calls `look` whenever elm_language_set() is called, before that goes through.
 void whenTheLanguageIsSet(std::function<void()> look);
+/// Calls `look` whenever a usage record is written.
+void whenARecordIsWritten(std::function<void()> look);
 /// Lets every call of that name fail: it gives nothing.
 void fail(const std::string& name);
 /// Whether the window manager takes rotations; in memory it does not.

@@ -137,6 +137,16 @@ TEST_F(LaterRequest, HasNoTransition) {
     EXPECT_EQ(transitions.finished(), 1) << "this one has";
 }
 
+TEST_F(LaterRequest, IsRecordedWhenItsPagerIsThere) {
+    writeCatalogue();
+    start();
+    std::vector<std::string> viewsThen;
+    calls::whenARecordIsWritten([&] { viewsThen = views(); });
+    request({{"appID", clockId}});
+    EXPECT_THAT(viewsThen, ElementsAre("KestMainView", "KestContentView"));
+    calls::whenARecordIsWritten(nullptr);
+}
+
 TEST_F(LaterRequest, ToAnEmptyScreenLeavesNothingToGoBackTo) {
     writeCatalogue();
     start({"appID=com.example.none"});

@@ -32,7 +32,13 @@ INSTANTIATE_TEST_SUITE_P(Of, Region,
                                          Country{"ZA", "Africa"}, Country{"KE", "Africa"}, Country{"NG", "Africa"},
                                          Country{"KR", "Global"}, Country{"US", "Global"}, Country{"in", "Global"},
                                          Country{"", "Global"}, Country{"IND", "Global"}, Country{"I", "Global"},
-                                         Country{" IN", "Global"}, Country{"Global", "Global"}));
+                                         Country{" IN", "Global"}, Country{"Global", "Global"}, Country{"ru", "Global"},
+                                         Country{"RUS", "Global"}, Country{"R", "Global"}, Country{"id", "Global"},
+                                         Country{"IDN", "Global"}, Country{"bd", "Global"}, Country{"BGD", "Global"},
+                                         Country{"B", "Global"}, Country{"lk", "Global"}, Country{"LKA", "Global"},
+                                         Country{"np", "Global"}, Country{"NPL", "Global"}, Country{"za", "Global"},
+                                         Country{"ZAF", "Global"}, Country{"ke", "Global"}, Country{"KEN", "Global"},
+                                         Country{"ng", "Global"}, Country{"NGA", "Global"}));
 
 class RegionOfNoCountry : public testing::Test, protected KestDevice {};
 

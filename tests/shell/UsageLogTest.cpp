@@ -9,8 +9,20 @@
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Pair;
+using testing::StartsWith;
 
-class UsageLog : public testing::Test, protected KestDevice {};
+class UsageLog : public testing::Test, protected KestDevice {
+protected:
+    /// That all calls for a record were made, whatever each of them gave.
+    static void expectAllCalls() {
+        EXPECT_THAT(calls::made(),
+                    ElementsAre("ravella_log_manager_create", "bundle_create", StartsWith("bundle_add_str app_id"),
+                                StartsWith("bundle_add_str feature"), StartsWith("bundle_add_str extra"),
+                                StartsWith("ravella_log_manager_insert "), "bundle_free",
+                                "ravella_log_manager_destroy"));
+        calls::forget();
+    }
+};
 
 TEST_F(UsageLog, GetsARecordOfAChosenMenu) {
     KestUsageLog::menuChosen("Wi-Fi & \"more\"");
@@ -23,8 +35,11 @@ TEST_F(UsageLog, GetsARecordOfAChosenMenu) {
 
 TEST_F(UsageLog, GetsAnEmptyTitleToo) {
     KestUsageLog::menuChosen("");
+    KestUsageLog::menuRequested("");
     EXPECT_THAT(device()->usage().all().at(0).values,
                 ElementsAre(Pair("app_id", "com.ravella.kest"), Pair("extra", ""), Pair("feature", "KT01")));
+    EXPECT_THAT(device()->usage().all().at(1).values,
+                ElementsAre(Pair("app_id", "com.ravella.kest"), Pair("extra", ""), Pair("feature", "KT03")));
 }
 
 TEST_F(UsageLog, IsOpenedAndClosedForEachRecord) {
@@ -44,6 +59,7 @@ TEST_F(UsageLog, IsOpenedAndClosedForEachRecord) {
 TEST_F(UsageLog, MayRefuseToOpen) {
     device::faults::plan("ravella_log_manager_create", -5);
     KestUsageLog::menuChosen("A");
+    expectAllCalls();
     EXPECT_THAT(device()->usage().all(), IsEmpty());
     EXPECT_THAT(kest_log::all(device()), IsEmpty());
 }
@@ -51,6 +67,7 @@ TEST_F(UsageLog, MayRefuseToOpen) {
 TEST_F(UsageLog, MayRefuseARecord) {
     device::faults::plan("ravella_log_manager_insert", -5);
     KestUsageLog::menuChosen("A");
+    expectAllCalls();
     EXPECT_THAT(device()->usage().all(), IsEmpty());
     EXPECT_THAT(kest_log::all(device()), IsEmpty());
     KestUsageLog::menuChosen("B");
@@ -60,6 +77,7 @@ TEST_F(UsageLog, MayRefuseARecord) {
 TEST_F(UsageLog, MayRefuseToClose) {
     calls::fail("ravella_log_manager_destroy");
     KestUsageLog::menuChosen("A");
+    expectAllCalls();
     EXPECT_EQ(device()->usage().all().size(), 1U);
     EXPECT_THAT(kest_log::all(device()), IsEmpty());
 }
@@ -67,6 +85,7 @@ TEST_F(UsageLog, MayRefuseToClose) {
 TEST_F(UsageLog, MayHaveNoMemoryForARecord) {
     calls::fail("bundle_create");
     KestUsageLog::menuChosen("A");
+    expectAllCalls();
     EXPECT_THAT(device()->usage().all(), IsEmpty());
     EXPECT_THAT(kest_log::all(device()), IsEmpty());
 }

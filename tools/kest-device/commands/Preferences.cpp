@@ -16,6 +16,13 @@ at the next start.
 Example:
   kest-device clear com.ravella.kest)";
 
+constexpr char preferencesAbout[] =
+    R"(One value a line: the application, the key, the value. Kest keeps in them what it has read of each tip.
+
+Examples:
+  kest-device preferences
+  kest-device preferences com.ravella.kest --json)";
+
 void requireKnown(device::Device& device, const std::string& id) {
     requireApplicationId(id);
     const std::vector<std::string> applications = device.preferences().applications();
@@ -62,6 +69,7 @@ void addPreferences(CLI::App& app, Session& session) {
     const auto json = std::make_shared<bool>(false);
     command->add_option("appid", *id, "Only this application")->type_name("APPID");
     addJsonOption(*command, *json);
+    command->footer(preferencesAbout);
     command->callback([id, json, &session] { list(session.device(), *id, *json); });
 }
 
