@@ -12,7 +12,6 @@ namespace catalogue {
 namespace {
 
 namespace fs = std::filesystem;
-using testing::ElementsAre;
 
 const fs::path project = PROJECT_FOLDER;
 
