@@ -1,4 +1,5 @@
 #include "HostileTest.h"
+#include "ProcessorClock.h"
 
 using namespace manager_log;
 using kest_files::contents;
@@ -200,6 +201,7 @@ TEST_F(HostileText, AttachmentsIdMayBeNearlyWhatTheContentsAreFullOf) {
 }
 
 TEST_F(HostileText, ALongTranslationMayBeAskedForInEveryText) {
+    const processor_clock::Standing clock;
     writeStrings({{"en", "IDS_A", std::string(9900000, 'x')}});
     EXPECT_EQ(loadTip(repeated("<contents>&lt;text id=\"IDS_A\"&gt;&lt;/text&gt;</contents>", 100000)).textContents,
               "<text id=\"IDS_A\"></text>");

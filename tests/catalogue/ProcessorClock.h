@@ -7,4 +7,12 @@ namespace processor_clock {
 
 extern std::int64_t ahead;
 
+/// While it lives that time stands still: what ends a load is what it does, however slow the machine is.
+struct Standing {
+    Standing();
+    ~Standing();
+    Standing(const Standing&) = delete;
+    Standing& operator=(const Standing&) = delete;
+};
+
 }  // namespace processor_clock

@@ -33,9 +33,9 @@ TEST_F(AppTest, IsCreatedStepByStep) {
     steps.erase(steps.begin());
     EXPECT_THAT(steps,
                 ElementsAre("addEventHandler 2 application", "app_get_preinitialized_window Kest",
-                            "elm_win_title_set Kest", "elm_win_autodel_set true", "elm_win_wm_rotation_supported_get",
-                            "elm_win_indicator_mode_set 2", "elm_win_indicator_opacity_set 1",
-                            "elm_app_base_scale_set 2.6", "elm_naviframe_add",
+                            "elm_win_title_set Kest shown", "elm_win_autodel_set true",
+                            "elm_win_wm_rotation_supported_get", "elm_win_indicator_mode_set 2",
+                            "elm_win_indicator_opacity_set 1", "elm_app_base_scale_set 2.6", "elm_naviframe_add",
                             "elm_naviframe_prev_btn_auto_pushed_set naviframe true",
                             "uxt_theme_add_color_table " + resource("table/com.ravella.kest_ChangeableColorInfo.xml"),
                             "uxt_theme_add_font_table " + resource("table/com.ravella.kest_ChangeableFontInfo.xml"),

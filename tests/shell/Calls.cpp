@@ -202,7 +202,7 @@ CALL(void, elm_win_indicator_opacity_set, Evas_Object* win, Elm_Win_Indicator_Op
 }
 
 CALL(void, elm_win_title_set, Evas_Object* win, const char* title) {
-    note("elm_win_title_set", title);
+    note("elm_win_title_set", title, evas_object_visible_get(win) ? "shown" : "hidden");
     __real_elm_win_title_set(win, title);
 }
 

@@ -158,7 +158,7 @@ TEST_F(RequestTest, PushesThePagerFirstAndTheListWhenTheMainLoopIsIdle) {
     test_ui::inMainLoop([&] {
         requestAtOnce({{"appID", clockId}}, true);
         EXPECT_THAT(views(), ElementsAre("KestContentView"));
-        EXPECT_THAT(calls::madeOf({"addIdler"}), Contains("addIdler Elm_Naviframe"));
+        EXPECT_THAT(calls::madeOf({"addIdler"}), ElementsAre("addIdler Elm_Layout", "addIdler Elm_Naviframe"));
     });
     settle();
     EXPECT_THAT(views(), ElementsAre("KestMainView", "KestContentView"));

@@ -15,7 +15,7 @@ std::string fruit(long index) {
 /// More than a row, and all rows together than a bus, can take.
 std::string praise() {
     std::string praise;
-    for (int i = 0; i < 2000; ++i) {
+    for (int i = 0; i < 1000; ++i) {
         praise += " is very good";
     }
     return praise;
