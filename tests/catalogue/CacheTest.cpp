@@ -191,3 +191,11 @@ TEST_F(Cache, AsksForTheIconAfresh) {
     EXPECT_EQ(loadAtNextStart().at(0).iconPath, device()->packages().find("com.example.clock")->icon);
     ASSERT_FALSE(loadedFromFiles());
 }
+
+TEST_F(Cache, KeepsNoIconThatTheDeviceNoLongerKnows) {
+    fill();
+    setPreference("contents_tip.xml_iconPath", "/old/icon.png");
+    device::faults::plan("package_info_create", -5, 100);
+    EXPECT_EQ(loadAtNextStart().at(0).iconPath, "No icon Path");
+    EXPECT_FALSE(loadedFromFiles());
+}

@@ -37,6 +37,11 @@ TEST_F(Contents, AreOldStyleWhenTheyHoldTheTitlesId) {
     EXPECT_TRUE(wereOldStyle());
 }
 
+TEST_F(Contents, OfTheOldStyleLoseEveryLineBreak) {
+    EXPECT_EQ(loadNewStyle("<item a></item>" + textTag("IDS_OWN") + "<br/>1<br>2<br/>3<br>4<br/>5<br>6"), "123456");
+    EXPECT_TRUE(wereOldStyle());
+}
+
 TEST_F(Contents, AreOldStyleWhenTheyHoldALongerId) {
     loadTip("<title id=\"IDS_WIFI\">x</title>" + contents(textTag("IDS_WIFI_BODY")));
     EXPECT_TRUE(wereOldStyle());

@@ -98,6 +98,23 @@ TEST_F(MainMenu, LetsALaterNokOverrideAnEarlierRegion) {
     EXPECT_THAT(loadedPaths(), IsEmpty());
 }
 
+TEST_F(MainMenu, LetsALaterRegionOverrideAnEarlierOne) {
+    menu("contents/a.xml");
+    writeMainMenu(mainMenu("<menu><path>contents/a.xml</path><appid>" + kest +
+                           "</appid><state>Global</state><state>India</state></menu>"));
+    EXPECT_THAT(loadedPaths(), IsEmpty());
+}
+
+TEST_F(MainMenu, KnowsItsElementsAndRegionsByTheirLettersAsTheyStand) {
+    for (const char* path : {"contents/a.xml", "contents/b.xml", "contents/c.xml"})
+        menu(path);
+    writeMainMenu(mainMenu("<menu><path>contents/a.xml</path><appid>" + kest + "</appid><state>global</state></menu>" +
+                           "<Menu><path>contents/b.xml</path><appid>" + kest + "</appid><state>Global</state></Menu>" +
+                           "<menu><path>contents/c.xml</path><Path>contents/b.xml</Path><appid>" + kest +
+                           "</appid><state>Global</state></menu>"));
+    EXPECT_THAT(loadedPaths(), ElementsAre("contents/c.xml"));
+}
+
 TEST_F(MainMenu, StartsEveryMenuAfresh) {
     menu("contents/a.xml");
     writeMainMenu(mainMenu(Menu{"contents/a.xml"}.xml() + "<menu><path>contents/a.xml</path></menu>"));

@@ -89,6 +89,26 @@ TEST_F(StringFile, FallsBackToTheFirstTwoLettersOfTheLanguage) {
     EXPECT_EQ(titleOf("IDS_MINE"), "Two letters");
 }
 
+TEST_F(StringFile, CountsLettersInALanguageOfThreeToo) {
+    writeStrings({{"fil", "IDS_MINE", "Three letters"}, {"fil_PH", "IDS_MINE", "Six"}, {"fi", "IDS_MINE", "Two"}});
+    setLanguage("fil_PH.UTF-8");
+    EXPECT_EQ(titleOf("IDS_MINE"), "Two");
+    writeStrings({{"fil_P", "IDS_MINE", "Five letters"}});
+    EXPECT_EQ(titleOf("IDS_MINE"), "Five letters");
+}
+
+TEST_F(StringFile, PutsRegionAndIdTogetherAsOneName) {
+    writeStrings({{"en", "US_IDS_MINE", "Mine"}});
+    EXPECT_EQ(titleOf("IDS_MINE"), "Mine");
+}
+
+TEST_F(StringFile, TakesOfAnEntryTheLastOfEachElement) {
+    writeFile("<strings><items><item><region>ko</region><stringid>IDS_A</stringid><value>A</value>"
+              "<region>en_US</region><stringid>IDS_B</stringid><value>B</value></item></items></strings>");
+    EXPECT_EQ(titleOf("IDS_B"), "B");
+    EXPECT_EQ(titleOf("IDS_A"), "untranslated");
+}
+
 TEST_F(StringFile, FollowsTheDevicesLanguage) {
     writeStrings({{"en", "IDS_MINE", "Mine"}, {"ko_KR", "IDS_MINE", "내 것"}, {"ko", "IDS_MINE", "다른"}});
     EXPECT_EQ(titleOf("IDS_MINE"), "Mine");

@@ -89,6 +89,11 @@ TEST_F(TextTag, ThatIsFaultyAndEmptyLeavesTheElementsOwnText) {
     EXPECT_TRUE(sawFaultyTag());
 }
 
+TEST_F(TextTag, ThatIsFaultyLeavesWhatStandsBeforeTheNextTag) {
+    EXPECT_EQ(loadContents("before <text id=\"IDS_A\" >See <b>this</b></text> after"), "See ");
+    EXPECT_EQ(loadContents("before <text a>b>c</text> after"), "b>c");
+}
+
 TEST_F(TextTag, ThatDoesNotEndIsNone) {
     EXPECT_EQ(loadContents("<text id=\"IDS_SYSTEM\">a"), "<text id=\"IDS_SYSTEM\">a");
     EXPECT_FALSE(sawFaultyTag());
@@ -112,11 +117,13 @@ TEST_F(TextTag, HasItsLineBreaksMadeSmall) {
     EXPECT_EQ(loadValue("a\nb"), "a" + lineBreak + "b");
     EXPECT_EQ(loadValue("a\\nb"), "a" + lineBreak + "b");
     EXPECT_EQ(loadValue("\n\\n\n"), lineBreak + lineBreak + lineBreak);
+    EXPECT_EQ(loadValue("a\\nb\\nc"), "a" + lineBreak + "b" + lineBreak + "c");
 }
 
 TEST_F(TextTag, HasItsAmpersandsEscaped) {
     EXPECT_EQ(loadValue("A & B"), "A &amp; B");
     EXPECT_EQ(loadValue("A &amp; B"), "A &amp;amp; B");
+    EXPECT_EQ(loadValue("A & B & C"), "A &amp; B &amp; C");
 }
 
 TEST_F(TextTag, KeepsTheMarkupOfItsTranslation) {
