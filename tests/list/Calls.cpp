@@ -75,7 +75,7 @@ Elm_Object_Item* __wrap_elm_genlist_item_append(Evas_Object* list, const Elm_Gen
                                                 Elm_Object_Item* parent, Elm_Genlist_Item_Type type, Evas_Smart_Cb func,
                                                 const void* funcData) {
     made().steps.emplace_back("row");
-    made().rows.push_back({itc, data, func, funcData, type});
+    made().rows.push_back({itc, data, parent, func, funcData, type});
     return __real_elm_genlist_item_append(list, itc, data, parent, type, func, funcData);
 }
 

@@ -16,6 +16,7 @@ namespace calls {
 struct Row {
     const Elm_Genlist_Item_Class* itemClass;
     const void* data;
+    const Elm_Object_Item* parent;
     Evas_Smart_Cb select;
     const void* selectData;
     Elm_Genlist_Item_Type type;

@@ -133,6 +133,8 @@ TEST_F(Life, SlidesInBeneathWhenItIsPushedSo) {
     EXPECT_EQ(elm_object_item_part_content_get(bottom, nullptr), view->getEvasObj());
     EXPECT_EQ(view->getNaviItem(), bottom);
     EXPECT_EQ(text(bottom, "elm.text.title"), "Tips");
+    EXPECT_EQ(elm_object_item_part_content_get(bottom, "elm.swallow.prev_btn"), nullptr);
+    EXPECT_EQ(elm_object_item_part_content_get(bottom, "elm.swallow.next_btn"), nullptr);
     elm_naviframe_item_pop(naviframe().getEvasObj());
     settle();
     EXPECT_EQ(topView(), "KestMainView");

@@ -53,6 +53,7 @@ TEST_F(Rows, HaveTheirClasses) {
     EXPECT_EQ(title.func.content_get, nullptr);
     EXPECT_EQ(title.func.del, nullptr);
     EXPECT_EQ(rows[0].data, nullptr);
+    EXPECT_EQ(rows[0].parent, nullptr);
     EXPECT_EQ(rows[0].select, nullptr);
     EXPECT_EQ(rows[0].type, ELM_GENLIST_ITEM_NONE);
     const Elm_Genlist_Item_Class& menu = *rows[1].itemClass;
@@ -61,6 +62,7 @@ TEST_F(Rows, HaveTheirClasses) {
     EXPECT_NE(menu.func.content_get, nullptr);
     EXPECT_NE(menu.func.del, nullptr);
     EXPECT_NE(rows[1].data, nullptr);
+    EXPECT_EQ(rows[1].parent, nullptr);
     EXPECT_EQ(rows[1].selectData, naviframe().getTopView());
     EXPECT_EQ(rows[1].type, ELM_GENLIST_ITEM_NONE);
 }

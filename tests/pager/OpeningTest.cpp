@@ -158,6 +158,21 @@ TEST_F(Opening, NotOnTopIsThereAtOnce) {
     EXPECT_EQ(title(), "Tips 1/2");
 }
 
+TEST_F(Opening, NotOnTopHasTheSameBackButton) {
+    writeTipsOfNumber(2);
+    startEmpty();
+    naviframe().push(new OtherView, "Other", nullptr);
+    settle();
+    push(0, false);
+    settle();
+    Evas_Object* back = elm_object_item_part_content_get(pager().getNaviItem(), "elm.swallow.prev_btn");
+    EXPECT_STREQ(elm_object_style_get(back), "naviframe/back_btn/default");
+    EXPECT_EQ(test_ui::text(back), "") << "the one that naviframes make by themselves names the view below";
+    screen().tap(back);
+    settle();
+    EXPECT_EQ(topView(), "OtherView");
+}
+
 TEST_F(Opening, StaysOnTopOfAListThatSlidesInBeneath) {
     writeTipsOfNumber(2);
     open(1);

@@ -51,6 +51,18 @@ TEST_F(ReplyButton, StaysHiddenWhenItIsPressedWhileTheFirstPictureIsShown) {
     EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide"));
 }
 
+TEST_F(ReplyButton, StaysHiddenWhenItIsPressedBeforeTheNextPictureComes) {
+    play(2, {}, 0.5);
+    pressReply();
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide"));
+}
+
+TEST_F(ReplyButton, StaysHiddenWhenItIsPressedWhileTheMarkerIsShown) {
+    play(2, {0}, 1.5);
+    pressReply();
+    EXPECT_THAT(calls::story(), ElementsAre("0.0 record", "0.0 area reply,hide"));
+}
+
 TEST_F(ReplyButton, HearsNoPressWhileALaterPictureIsShown) {
     play(3, {}, 3);
     pressReply();

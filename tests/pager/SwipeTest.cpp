@@ -50,6 +50,16 @@ TEST_F(Swipe, DisplaysThePageWhenItHasComeToRest) {
     EXPECT_THAT(calls::story(1), ElementsAre("0.7 info show"));
 }
 
+TEST_F(Swipe, ThatARequestInterruptsDisplaysTheRequestedPageLast) {
+    openAtRest();
+    swipe();
+    test_ui::runFor(0.1);
+    test_ui::inMainLoop([&] { pager().showContentsPage(2); });
+    test_ui::runFor(1);
+    EXPECT_EQ(pageInView(), 2);
+    EXPECT_EQ(title(), "Tips 3/3");
+}
+
 TEST_F(Swipe, GoesToTheLastPageAndBack) {
     openAtRest();
     std::vector<std::string> titles;
