@@ -16,12 +16,12 @@ protected:
     static constexpr char clockId[] = "com.ravella.clock";
     static constexpr char clockTip[] = "appID=com.ravella.clock";
     static constexpr char settingsTip[] = "appID=com.ravella.settings";
+    static constexpr char postNotification[] = "LaunchingType=addNoti";
 
     const int clockMenu_ = menuOf("contents/clock_faces.xml");
     const int settingsMenu_ = menuOf("contents/settings_palm.xml");
     const int heartrateMenu_ = menuOf("contents/heartrate_measure.xml");
     const int exerciseMenu_ = menuOf("contents/exercise_walk.xml");
-    static constexpr char postNotification[] = "LaunchingType=addNoti";
 
     test_tool::Result launch(const std::vector<std::string>& extras = {}) {
         std::vector<std::string> words{"launch", app, "--headless"};

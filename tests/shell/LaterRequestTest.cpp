@@ -160,8 +160,7 @@ TEST_F(LaterRequest, ToAnEmptyScreenHasABackButtonThatLeadsOut) {
     start({"appID=com.example.none"});
     request({{"appID", clockId}});
     ASSERT_FALSE(test_ui::hasEnded());
-    screen().tap(
-        elm_object_item_part_content_get(elm_naviframe_top_item_get(naviframe().getEvasObj()), "elm.swallow.prev_btn"));
+    screen().tap(elm_object_item_part_content_get(naviframe().getTopView()->getNaviItem(), "elm.swallow.prev_btn"));
     EXPECT_TRUE(test_ui::hasEnded());
 }
 
